@@ -1,0 +1,169 @@
+#pragma once
+#include <QHash>
+#include <QMainWindow>
+#include <QString>
+#include <array>
+#include <memory>
+
+#include "paint/PaintEngine.h"
+#include "paint/Workspace.h"
+#include "platform/Platform.h"
+
+class QAction;
+class QCheckBox;
+class QGroupBox;
+class QLabel;
+class QLineEdit;
+class QMenu;
+class QTimer;
+class QToolBar;
+class ColorBoxLabel;
+class DriveListBox;
+class FileListBox;
+class FolderListBox;
+class PictureView;
+
+// The one window of the program. It owns the workspace and every control;
+// its handlers are thin and spread over files by subsystem:
+//   shell/TintrollaForm*.cpp        layout, start-up, poll, closing, toolbar, menus, cursors
+//   shell/TitleScreen.cpp           the colour-cycling title screen
+//   paint/qt/TintrollaForm_Picture.cpp   the work picture's mouse handlers
+//   scheme/qt/TintrollaForm_Colors.cpp   colour boxes, renaming, scheme files
+//   store/qt/TintrollaForm_*.cpp         browser, opening, saving, deleting
+class TintrollaForm : public QMainWindow, public PaintHost {
+    Q_OBJECT
+public:
+    static constexpr int kClientWidth = 671;   // 10065 x 5625 twips
+    static constexpr int kClientHeight = 375;
+    static inline const QString kCaption = QStringLiteral(" Tint-Rolla  v1.03");
+
+    // `programFolder` is where PICS lies: the executable's folder in the
+    // program, a temporary folder in tests.
+    TintrollaForm(platform::Platform& platform, const QString& programFolder, QWidget* parent = nullptr);
+    ~TintrollaForm() override;
+
+    Workspace& workspace() { return *ws_; }
+    PaintEngine& engine() { return *engine_; }
+    platform::Platform& platformLayer() { return platform_; }
+
+    // --- PaintHost ---
+    void RefreshPicture() override;
+    void ToolStateChanged() override;
+    void Warning(const std::string& title, const std::string& text) override;
+    void PumpEvents() override;
+    void SelectColorBox(int index) override;
+
+    // --- Main window and start-up (shell/TintrollaForm_Startup.cpp) ---
+    void Form_Load();
+    void StartupTimer_Timer();
+    void BackgroundTimer_Timer();
+    void Form_Click();
+    bool Form_QueryUnload();   // true = cancel the close
+    void ExitMenuItem_Click();
+    // Shows a message through the platform layer.
+    platform::Answer Ask(const QString& title, const QString& text, platform::Buttons buttons,
+                         platform::Icon icon = platform::Icon::None);
+
+    QString ProgramFolder;
+    QString PicsPath;
+    QString CurrentPicturePath;
+    QString RequestedPicturePath;
+    QString ExportFolder;
+    QString SchemeFileName;
+    bool startupDone() const { return startupDone_; }
+
+    // --- Toolbar, menus and cursors (shell/TintrollaForm_Toolbar.cpp, _Menus.cpp, _Cursors.cpp) ---
+    void buildToolbar();
+    void buildMenus();
+    void Toolbar1_ButtonClick(const QString& key);
+    void setToolbarButtonEnabled(const QString& key, bool enabled);
+    bool toolbarButtonEnabled(const QString& key) const;
+    void syncToolbar();          // pressed and enabled states from the workspace
+    void applyPictureCursor();   // the work picture's cursor from the workspace
+    void updateMenus();          // enabling and check marks, as a top-level menu opens
+    void UpdatePictureCursor();  // the tool-state call, then the window follows
+    QHash<QString, QAction*> toolbarButtons;
+    QHash<QString, QAction*> menuItems;   // by control name, e.g. "SaveMenuItem"
+    QHash<QString, QMenu*> menus;         // by control name, e.g. "FileMenu"
+
+    // --- Title screen (shell/TitleScreen.cpp) ---
+    void DrawTitleScreen();
+    void PrintAt(int x, int y, const QString& text);
+    void AboutMenuItem_Click();
+
+    // --- Colour boxes and scheme files (scheme/qt/TintrollaForm_Colors.cpp, _Scheme.cpp) ---
+    void buildColorBoxes();
+    void syncColorBoxes();
+    void PictureColor_MouseDown(int index, int button);
+    void PictureColor_MouseUp(int index, int button);
+    void PictureColor_DblClick(int index);
+    void NewColourMenuItem_Click();
+    void ClearAllColorsMenuItem_Click();
+    void commitRename();
+    void cancelRename();
+    void LoadSchemeMenuItem_Click();
+    void SaveSchemeMenuItem_Click();
+    bool ReadColorScheme(const QString& path);
+    bool WriteColorScheme(const QString& path);
+
+    // --- Picture store (store/qt/TintrollaForm_Browser.cpp, _Open.cpp, _Save.cpp) ---
+    void buildBrowser();
+    void ShowPicsFolder();
+    void ShowDesktopFolder();
+    void SetFileListPattern();
+    void Dir1_Change();
+    void Drive1_Change();
+    void File1_Click();
+    void OpenFromFileMenuItem_Click();
+    void OpenFromClipboardMenuItem_Click();
+    void OpenPicture();
+    void SaveWork();
+    void DeletePicture();
+
+    // --- The work picture (paint/qt/TintrollaForm_Picture.cpp) ---
+    void Picture1_MouseDown(int button, float x, float y);
+    void Picture1_MouseMove(int buttons, float x, float y);
+    void Picture1_MouseUp(int button, float x, float y);
+
+    // --- Option check boxes (shell/TintrollaForm_Options.cpp) ---
+    void AutoCropCheckbox_Click();
+    void BlendEdgesCheckbox_Click();
+    void ExpandEdgesCheckbox_Click();
+    void ProtectPaintCheckbox_Click();
+
+    // --- Controls ---
+    QWidget* client = nullptr;
+    QToolBar* Toolbar1 = nullptr;
+    PictureView* Picture1 = nullptr;
+    QLabel* Picture2 = nullptr;          // hidden; the photo itself lives in the workspace
+    QLabel* TitleBackground = nullptr;   // hidden; holds the 80 x 60 title background
+    QGroupBox* ColorSchemeFrame = nullptr;
+    std::array<ColorBoxLabel*, kColorBoxCount + 1> PictureColor{};
+    QLineEdit* ColorNameBox = nullptr;
+    QString ColorNameBoxTag;             // index of the box being renamed; empty = none
+    QLabel* PickupColorLabel = nullptr;
+    QLabel* Label1 = nullptr;
+    DriveListBox* Drive1 = nullptr;
+    FolderListBox* Dir1 = nullptr;
+    FileListBox* File1 = nullptr;
+    QCheckBox* AutoCropCheckbox = nullptr;
+    QCheckBox* BlendEdgesCheckbox = nullptr;
+    QCheckBox* ExpandEdgesCheckbox = nullptr;
+    QCheckBox* ProtectPaintCheckbox = nullptr;
+    QCheckBox* LoadwithPictureCheckbox = nullptr;
+    QTimer* StartupTimer = nullptr;
+    QTimer* BackgroundTimer = nullptr;
+
+protected:
+    void closeEvent(QCloseEvent* event) override;
+    void mousePressEvent(QMouseEvent* event) override;
+
+private:
+    void buildLayout();
+    QRect twips(int left, int top, int width, int height) const;
+
+    platform::Platform& platform_;
+    std::unique_ptr<Workspace> ws_;
+    std::unique_ptr<PaintEngine> engine_;
+    bool startupDone_ = false;
+};

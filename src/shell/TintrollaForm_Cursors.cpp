@@ -1,0 +1,4 @@
+// Placeholder: the work picture's cursors are set here.
+#include "shell/TintrollaForm.h"
+
+void TintrollaForm::applyPictureCursor() {}

@@ -1,0 +1,5 @@
+// Placeholder: the menus are built here.
+#include "shell/TintrollaForm.h"
+
+void TintrollaForm::buildMenus() {}
+void TintrollaForm::updateMenus() {}
