@@ -12,7 +12,7 @@ void PaintEngine::RepaintColor(int) {}
 void PaintEngine::RenderEdges(int) {}
 void PaintEngine::BlendOutsidePixel(int, int, int) {}
 void PaintEngine::BlendBoundaryPixel(int&, int&) {}
-void PaintEngine::RefreshPicture() {}
+void PaintEngine::RefreshAll() {}
 void PaintEngine::UndoStroke() {}
 void PaintEngine::RedoStroke() {}
 void PaintEngine::ClearAll() {}

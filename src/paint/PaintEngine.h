@@ -47,7 +47,7 @@ public:
     void RenderEdges(int mode);
     void BlendOutsidePixel(int x, int y, int i);
     void BlendBoundaryPixel(int& a, int& b);
-    void RefreshPicture();  // the refresh command: photo, every box, edge pass
+    void RefreshAll();  // the refresh command: photo, every box, edge pass
 
     // --- Undo and redo ---
     void UndoStroke();
