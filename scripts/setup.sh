@@ -5,12 +5,10 @@ set -euo pipefail
 
 packages=(
   build-essential cmake pkg-config
-  qt6-base-dev qt6-base-dev-tools libqt6opengl6-dev
-  libgl-dev
+  qt6-base-dev qt6-base-dev-tools
   libturbojpeg0-dev
   libgtest-dev libgmock-dev libbenchmark-dev
   fonts-liberation2 fonts-dejavu-core
-  xauth xvfb
 )
 
 missing=()
