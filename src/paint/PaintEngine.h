@@ -1,5 +1,8 @@
 #pragma once
+#include <array>
+#include <cstdint>
 #include <string>
+#include <vector>
 
 #include "paint/Workspace.h"
 
@@ -25,6 +28,15 @@ inline constexpr int kLeftButton = 1;
 inline constexpr int kRightButton = 2;
 inline constexpr int kMiddleButton = 4;
 
+// The program's words for the painting warnings.
+inline constexpr const char* kPaintingTitle = "Warning - Painting Picture";
+inline constexpr const char* kNoPaintColorText = "No Paint color has been set yet.";
+inline constexpr const char* kSetReferenceTitle = "Warning - Set Reference";
+inline constexpr const char* kNotRepaintedText = "This area is not re-painted.";
+inline constexpr const char* kTooManyStrokesText =
+    "No more strokes can be painted on this picture.\r\n"
+    "Please use Undo or Clear All before painting again.";
+
 // The painting engine: roller, recolour rendering, undo and redo, and the
 // edge tools, all working on one workspace. Positions are work-picture pixels.
 class PaintEngine {
@@ -32,18 +44,27 @@ public:
     PaintEngine(Workspace& ws, PaintHost& host) : ws_(ws), host_(host) {}
 
     // --- The work picture's mouse handlers (X, Y as floats in pixels) ---
+    // A press outside the 400 x 300 picture does nothing; moves and releases
+    // outside it are clipped wherever they would touch a pixel.
     void MouseDown(int button, float x, float y);
     void MouseMove(int buttons, float x, float y);
     void MouseUp(int button, float x, float y);
 
     // --- Roller ---
+    // One application: rings 1..20 (wide) or 1..5 (narrow) around (x, y),
+    // then one refresh.
     void RollerAt(int x, int y);
+    // Tries to paint one pixel with CurrentColor; true when it was painted.
     bool PaintPixel(int x, int y);
+    // Pulls MatchColor toward the planes of (x, y) by MatchWeight.
     void UpdateMatchColor(int x, int y);
 
     // --- Rendering ---
+    // Draws (x, y) of Picture1 from the drawing colour and the photo's luma.
     void RecolorPixel(int x, int y);
+    // Redraws every painted pixel of box |i| (nothing while it has no reference).
     void RepaintColor(int i);
+    // Edge pass: 0 = as the Blend Edges option says, 1 = plain, 2 = blend.
     void RenderEdges(int mode);
     void BlendOutsidePixel(int x, int y, int i);
     void BlendBoundaryPixel(int& a, int& b);
@@ -60,6 +81,42 @@ public:
     void DrawChalkLine(bool erase, bool commit);
 
 private:
+    // Press steps that hand over to the other tools.
+    bool ReferenceStep(int x, int y);   // false: the press ends here
+    void PickupClick(int x, int y);
+    void BeginRollerStroke(int x, int y);
+    void CommitChalkLine(int x, int y);
+    void FollowChalkLine(int x, int y);
+
+    // False (after telling the user) when one more stroke number would not
+    // fit the 16-bit stroke plane.
+    bool RoomForAnotherStroke();
+    bool Inside(int x, int y) const { return x >= 0 && y >= 0 && x <= maxX() && y <= maxY(); }
+    int maxX() const { return ws_.WholeMaxX(); }
+    int maxY() const { return ws_.WholeMaxY(); }
+    // Colours of box i; a box index outside 1..12 (a damaged mask) reads as empty.
+    int32_t BoxColor(int i) const;
+    int32_t BoxReference(int i) const;
+
+    // The colour RecolorPixel draws for a luma, under the drawing colour.
+    int32_t RecolorValue(int32_t lum);
+
     Workspace& ws_;
     PaintHost& host_;
+
+    // A roller stroke was begun by the last press: its release closes it.
+    bool strokeOpen_ = false;
+
+    // RecolorPixel depends only on the luma and the four drawing-colour
+    // values, so results are kept per luma until the drawing colour changes.
+    struct RecolorCache {
+        std::array<float, 4> key{-1.0f, -1.0f, -1.0f, -1.0f};
+        uint32_t generation = 1;
+        std::array<uint32_t, 256> stamp{};
+        std::array<int32_t, 256> color{};
+    };
+    RecolorCache cache_;
+
+    // Pixels that edge expansion adds, written only once the pass is over.
+    std::vector<int32_t> grown_;
 };
