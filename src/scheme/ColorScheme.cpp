@@ -1,6 +1,59 @@
-// Placeholder bodies: the colour boxes are built in the files beside this one.
 #include "scheme/ColorScheme.h"
 
-void SetNewColor(Workspace&, int32_t, int) {}
-void SelectBox(Workspace&, int) {}
-void ClearAllColors(Workspace&) {}
+#include <cstdlib>
+
+#include "imaging/HSLcolor.h"
+#include "paint/Tools.h"
+#include "scheme/SchemeFile.h"
+
+namespace {
+// Box number from an index that may carry a sign; 0 when out of range.
+int BoxNumber(int index) {
+    const long i = std::labs(static_cast<long>(index));
+    return (i >= 1 && i <= kColorBoxCount) ? static_cast<int>(i) : 0;
+}
+} // namespace
+
+void SetNewColor(Workspace& ws, int32_t rgb, int index) {
+    const int i = BoxNumber(index);
+    if (i == 0) return;
+    const HSLcolor::HSL paint = HSLcolor::RGBToHSL(HSLcolor::SplitColor(rgb));
+    ws.PaintHue = paint.hue;
+    ws.PaintSat = paint.sat;
+    ws.PaintLum = paint.lum;
+    ws.Boxes[i].color = rgb;
+}
+
+void SelectBox(Workspace& ws, int i) {
+    i = BoxNumber(i);
+    if (i == 0) return;
+    LoadDrawColor(ws, i);
+    ws.CurrentColor = static_cast<int16_t>(i);
+    EndModalTools(ws);
+    UpdatePictureCursor(ws);
+}
+
+void ClearAllColors(Workspace& ws) {
+    for (int i = 1; i <= kColorBoxCount; ++i) {
+        ws.Boxes[i].color = kButtonFace;
+        ws.Boxes[i].reference = 0;
+    }
+}
+
+void ApplyScheme(Workspace& ws, const ColorBoxes& boxes) {
+    for (int i = 1; i <= kColorBoxCount; ++i) {
+        ws.Boxes[i].name = boxes[i].name;
+        ws.Boxes[i].reference = boxes[i].reference;
+        SetNewColor(ws, boxes[i].color, i);
+    }
+}
+
+bool LoadScheme(Workspace& ws, const std::vector<uint8_t>& bytes, std::string& problem) {
+    const SchemeFile::Decoded decoded = SchemeFile::Decode(bytes);
+    if (!decoded.ok) {
+        problem = decoded.problem;
+        return false;
+    }
+    ApplyScheme(ws, decoded.boxes);
+    return true;
+}

@@ -101,10 +101,21 @@ public:
     void ClearAllColorsMenuItem_Click();
     void commitRename();
     void cancelRename();
+    void ColorNameBox_Change();   // keeps the name to 15 characters, caret kept
     void LoadSchemeMenuItem_Click();
     void SaveSchemeMenuItem_Click();
-    bool ReadColorScheme(const QString& path);
-    bool WriteColorScheme(const QString& path);
+    // Reads the scheme file that belongs to `path` (its last extension becomes
+    // ".csc") into the twelve boxes and shows them. The whole file is read and
+    // checked first: a missing, short or damaged file changes no box. Then
+    // returns false, shows "Error - Load Colour Scheme" unless `showMessage`
+    // is false, and puts the reason into `problem` when given. A missing file
+    // is never created.
+    bool ReadColorScheme(const QString& path, bool showMessage = true, QString* problem = nullptr);
+    // Writes the twelve boxes to the scheme file that belongs to `path`,
+    // replacing an old file only once the new one is complete, and sets
+    // SchemeFileName to it. On failure: false, "Error - Save Colour Scheme"
+    // unless `showMessage` is false, the reason in `problem` when given.
+    bool WriteColorScheme(const QString& path, bool showMessage = true, QString* problem = nullptr);
 
     // --- Picture store (store/qt/TintrollaForm_Browser.cpp, _Open.cpp, _Save.cpp) ---
     void buildBrowser();

@@ -11,18 +11,28 @@ ColorBoxLabel::ColorBoxLabel(int index, QWidget* parent) : QLabel(parent), index
     setLineWidth(2);
 }
 
+QColor ColorBoxQColor(int32_t value, const QColor& buttonFace) {
+    if (value == kButtonFace) return buttonFace;
+    return QColor(value & 0xFF, (value >> 8) & 0xFF, (value >> 16) & 0xFF);
+}
+
 namespace {
-QColor FromColorValue(int32_t v) { return QColor(v & 0xFF, (v >> 8) & 0xFF, (v >> 16) & 0xFF); }
 int ButtonCode(Qt::MouseButton b) {
     return b == Qt::LeftButton ? kLeftButton : b == Qt::RightButton ? kRightButton : kMiddleButton;
 }
 } // namespace
 
 void ColorBoxLabel::setLook(int32_t backColor, int32_t foreColor, bool flat) {
+    if (lookSet_ && backColor == back_ && foreColor == fore_ && flat == flat_) return;
+    lookSet_ = true;
+    back_ = backColor;
+    fore_ = foreColor;
+    flat_ = flat;
+    // "No colour" shows the button colour of the window the box sits in.
+    const QWidget* host = parentWidget() ? parentWidget() : this;
     QPalette pal = palette();
-    const QColor back = backColor == kButtonFace ? QPalette().color(QPalette::Button) : FromColorValue(backColor);
-    pal.setColor(QPalette::Window, back);
-    pal.setColor(QPalette::WindowText, FromColorValue(foreColor));
+    pal.setColor(QPalette::Window, ColorBoxQColor(backColor, host->palette().color(QPalette::Button)));
+    pal.setColor(QPalette::WindowText, ColorBoxQColor(foreColor, Qt::white));
     setPalette(pal);
     setFrameStyle(flat ? (QFrame::Box | QFrame::Plain) : (QFrame::Panel | QFrame::Raised));
     setLineWidth(flat ? 1 : 2);
@@ -30,4 +40,12 @@ void ColorBoxLabel::setLook(int32_t backColor, int32_t foreColor, bool flat) {
 
 void ColorBoxLabel::mousePressEvent(QMouseEvent* event) { emit pressed(index_, ButtonCode(event->button())); }
 void ColorBoxLabel::mouseReleaseEvent(QMouseEvent* event) { emit released(index_, ButtonCode(event->button())); }
-void ColorBoxLabel::mouseDoubleClickEvent(QMouseEvent*) { emit doubleClicked(index_); }
+
+// Only the left button asks for a new colour; a second press of another
+// button is an ordinary press.
+void ColorBoxLabel::mouseDoubleClickEvent(QMouseEvent* event) {
+    if (event->button() == Qt::LeftButton)
+        emit doubleClicked(index_);
+    else
+        emit pressed(index_, ButtonCode(event->button()));
+}

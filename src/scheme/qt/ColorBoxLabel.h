@@ -1,16 +1,21 @@
 #pragma once
 #include <QLabel>
+#include <cstdint>
 
 // One colour box of the scheme: a label that reports presses, releases and
-// double clicks with the button that caused them.
+// left double clicks with the button that caused them.
 class ColorBoxLabel : public QLabel {
     Q_OBJECT
 public:
     ColorBoxLabel(int index, QWidget* parent = nullptr);
     int index() const { return index_; }
 
-    // Paint colour (or no colour), name colour and the flat or raised look.
+    // Paint colour (kButtonFace: the window's button colour), name colour and
+    // the flat (selected) or raised look. Repaints only when something changed.
     void setLook(int32_t backColor, int32_t foreColor, bool flat);
+    int32_t backColor() const { return back_; }
+    int32_t foreColor() const { return fore_; }
+    bool isFlat() const { return flat_; }
 
 signals:
     void pressed(int index, int button);
@@ -24,4 +29,11 @@ protected:
 
 private:
     int index_;
+    int32_t back_ = 0;
+    int32_t fore_ = 0;
+    bool flat_ = false;
+    bool lookSet_ = false;
 };
+
+// A colour value as a QColor; kButtonFace becomes `buttonFace`.
+QColor ColorBoxQColor(int32_t value, const QColor& buttonFace);
