@@ -18,8 +18,11 @@ void ColorNameEdit::keyPressEvent(QKeyEvent* event) {
     }
 }
 
+// A menu or the text box's own context menu opening, or another program
+// becoming active, is not the user leaving the name.
 void ColorNameEdit::focusOutEvent(QFocusEvent* event) {
     QLineEdit::focusOutEvent(event);
+    if (event->reason() == Qt::PopupFocusReason || event->reason() == Qt::ActiveWindowFocusReason) return;
     emit commitRequested();
 }
 

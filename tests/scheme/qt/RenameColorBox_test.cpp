@@ -136,6 +136,20 @@ private slots:
         QCOMPARE(f.form().ColorNameBox->text(), QStringLiteral("Extra 3"));
     }
 
+    void openingAMenuDoesNotCommit() {
+        FormFixture f;
+        rightClick(f, 5);
+        f.form().ColorNameBox->setText(QStringLiteral("Lower Wal"));
+        QFocusEvent popup(QEvent::FocusOut, Qt::PopupFocusReason);
+        QCoreApplication::sendEvent(f.form().ColorNameBox, &popup);
+        QVERIFY(renaming(f));
+        QCOMPARE(f.ws().Boxes[5].name, std::string("Lower Wall"));
+        QFocusEvent tab(QEvent::FocusOut, Qt::TabFocusReason);
+        QCoreApplication::sendEvent(f.form().ColorNameBox, &tab);
+        QVERIFY(!renaming(f));
+        QCOMPARE(f.ws().Boxes[5].name, std::string("Lower Wal"));
+    }
+
     void losingTheFocusCommits() {
         FormFixture f;
         f.form().show();
