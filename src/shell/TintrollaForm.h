@@ -83,13 +83,26 @@ public:
     void updateMenus();          // enabling and check marks, as a top-level menu opens
     void UpdatePictureCursor();  // the tool-state call, then the window follows
     QHash<QString, QAction*> toolbarButtons;
-    QHash<QString, QAction*> menuItems;   // by control name, e.g. "SaveMenuItem"
-    QHash<QString, QMenu*> menus;         // by control name, e.g. "FileMenu"
+    QHash<QString, QAction*> menuItems;   // by control name, e.g. "SaveMenuItem"; sub-menus too
+    QHash<QString, QMenu*> menus;         // by control name, e.g. "FileMenu", "ExportMenu"
+    // The maker's home page, opened by "&Visit Moonfield".
+    static inline const QString kHomePage = QStringLiteral("https://www.moonfield.com.au/");
+    void RefreshMenuItem_Click();
+    void VisitMoonfieldMenuItem_Click();
+    void HelpTopicMenuItem_Click(int topic);   // 0-based, in menu order
+    void RollerWideMenuItem_Click();
+    void RollerNarrowMenuItem_Click();
+    void ChalkLineMenuItem_Click();
 
     // --- Title screen (shell/TitleScreen.cpp) ---
     void DrawTitleScreen();
     void PrintAt(int x, int y, const QString& text);
     void AboutMenuItem_Click();
+    // The background as drawn and as last shown, and how far its hues are
+    // turned (each redraw turns them two steps further from the original).
+    Picture TitleBackgroundOriginal;
+    Picture TitleBackgroundPicture;
+    int TitleHueTurn = 0;
 
     // --- Colour boxes and scheme files (scheme/qt/TintrollaForm_Colors.cpp, _Scheme.cpp) ---
     void buildColorBoxes();
@@ -130,6 +143,16 @@ public:
     void OpenPicture();
     void SaveWork();
     void DeletePicture();
+    // The literal request for the clipboard's picture.
+    static inline const QString kClipboardRequest = QStringLiteral(".GET-FROM-CLIPBOARD.");
+    bool showFolder(const QString& folder);
+    void rereadFileList();
+    // Yields, then true (and LoadingPicture False) when a newer picture was asked for.
+    bool loadAbandoned();
+    void failLoad(const QString& error);
+    bool isPreviousWork(const QString& path) const;
+    // Writes the work's four files as one: all are staged before any replaces its old copy.
+    bool writeWorkFiles(const QString& base, QString& error);
 
     // --- The work picture (paint/qt/TintrollaForm_Picture.cpp) ---
     void Picture1_MouseDown(int button, float x, float y);

@@ -1,34 +1,72 @@
 #pragma once
 #include <QComboBox>
 #include <QListWidget>
+#include <QStringList>
 
 // The picture browser's three lists: mounted volumes, the folder chain with
 // its subfolders, and the pictures of the folder that match the pattern.
+
+// Mounted volumes by their root path. `drive()` is the chosen root.
 class DriveListBox : public QComboBox {
     Q_OBJECT
 public:
-    using QComboBox::QComboBox;
+    explicit DriveListBox(QWidget* parent = nullptr);
+    void reread();
+    QString drive() const;
+    // Shows the volume that holds `path` (adding it when the list lacks it).
+    void setDriveOf(const QString& path);
+
+signals:
+    void driveChosen();  // the user picked a drive
+
+private:
+    bool quiet_ = false;
 };
 
+// The folder chain from the root down to the open folder, then its
+// subfolders. Activating an entry (double click, Enter) opens it.
 class FolderListBox : public QListWidget {
     Q_OBJECT
 public:
-    using QListWidget::QListWidget;
+    explicit FolderListBox(QWidget* parent = nullptr);
     QString path() const { return path_; }
-    void setPath(const QString& path) { path_ = path; }
+    // Opens `path`; false (nothing changed) when it is no readable folder.
+    // Emits pathChanged when the path changed.
+    bool setPath(const QString& path);
+    // The folder of the highlighted entry; empty when none is highlighted.
+    QString highlightedPath() const;
+    static QString pathOf(const QListWidgetItem* item);
+
+signals:
+    void pathChanged();
 
 private:
     QString path_;
 };
 
+// Files of one folder that match a pattern such as "*.jpg;*.gif;*.bmp",
+// letter case ignored, sorted by name.
 class FileListBox : public QListWidget {
     Q_OBJECT
 public:
-    using QListWidget::QListWidget;
+    explicit FileListBox(QWidget* parent = nullptr);
     QString path() const { return path_; }
-    void setPath(const QString& path) { path_ = path; }
+    void setPath(const QString& path);
     QString pattern() const { return pattern_; }
-    void setPattern(const QString& pattern) { pattern_ = pattern; }
+    void setPattern(const QString& pattern);
+    void reread();
+    QStringList entries() const;
+    // The selected file name; empty when no entry is selected.
+    QString selectedName() const;
+    // Selects the first entry equal to `name` ignoring case; false when none.
+    bool selectName(const QString& name);
+    static bool matches(const QString& name, const QString& pattern);
+
+signals:
+    void fileClicked();  // a click, or the keyboard moving the selection
+
+protected:
+    void keyPressEvent(QKeyEvent* event) override;
 
 private:
     QString path_;
