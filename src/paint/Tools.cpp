@@ -21,8 +21,10 @@ void StartPickup(Workspace& ws) {
 
 void ToggleSetReference(Workspace& ws) {
     if (!ws.SetReferenceMode) {
-        // Only the icon changes: a box without colour keeps the no-drop pointer.
-        if (ws.Cursor != PictureCursor::NoDrop) ws.Cursor = PictureCursor::SetReference;
+        // Only the icon of a custom pointer changes: the no-drop pointer of a
+        // box without colour, and the plain default pointer, stay as they are.
+        if (ws.Cursor != PictureCursor::NoDrop && ws.Cursor != PictureCursor::Default)
+            ws.Cursor = PictureCursor::SetReference;
         ws.SetReferenceMode = true;
         ws.PickupLabelVisible = false;
     } else {
@@ -41,7 +43,7 @@ void SelectPaint(Workspace& ws, PaintKind kind, int weight, int tolerance) {
     ws.MatchWeight = weight;
     SetTolerance(ws, tolerance);
     EndModalTools(ws);
-    ws.Kind = kind;
+    ws.Kind = kind;  // the paint-kind button down
     UpdatePictureCursor(ws);
 }
 } // namespace
@@ -49,3 +51,13 @@ void SelectPaint(Workspace& ws, PaintKind kind, int weight, int tolerance) {
 void SelectDryPaint(Workspace& ws) { SelectPaint(ws, PaintKind::Dry, 1, 4); }
 void SelectNormalPaint(Workspace& ws) { SelectPaint(ws, PaintKind::Normal, 50, 12); }
 void SelectWetPaint(Workspace& ws) { SelectPaint(ws, PaintKind::Wet, 5, 30); }
+
+SizeTool CurrentSizeTool(const Workspace& ws) {
+    if (ws.ChalkLineMode) return SizeTool::ChalkLine;
+    return ws.WideRoller ? SizeTool::Wide : SizeTool::Narrow;
+}
+
+void SetSizeTool(Workspace& ws, SizeTool tool) {
+    ws.ChalkLineMode = tool == SizeTool::ChalkLine;
+    ws.WideRoller = tool == SizeTool::Wide;
+}

@@ -1,7 +1,31 @@
-// Placeholder: the option check boxes' click handlers.
+#include <QCheckBox>
+
+#include "paint/Tools.h"
 #include "shell/TintrollaForm.h"
 
-void TintrollaForm::AutoCropCheckbox_Click() {}
-void TintrollaForm::BlendEdgesCheckbox_Click() {}
-void TintrollaForm::ExpandEdgesCheckbox_Click() {}
-void TintrollaForm::ProtectPaintCheckbox_Click() {}
+// The check boxes hold the options; their values reach the workspace through
+// their toggled signal before these handlers run.
+
+void TintrollaForm::AutoCropCheckbox_Click() {
+    // Opens the selected picture again, now cut or stretched as chosen.
+    File1_Click();
+}
+
+void TintrollaForm::BlendEdgesCheckbox_Click() {
+    UpdatePictureCursor();
+    EndModalTools(workspace());
+    ToolStateChanged();
+    engine().RenderEdges(0);  // blend or restore by the check box
+}
+
+void TintrollaForm::ExpandEdgesCheckbox_Click() {
+    UpdatePictureCursor();
+    EndModalTools(workspace());
+    ToolStateChanged();
+}
+
+void TintrollaForm::ProtectPaintCheckbox_Click() {
+    UpdatePictureCursor();
+    EndModalTools(workspace());
+    ToolStateChanged();
+}
