@@ -7,10 +7,11 @@
 namespace SchemeFile {
 
 std::string SchemePath(const std::string& path) {
-    const size_t nameStart = path.rfind('/') == std::string::npos ? 0 : path.rfind('/') + 1;
+    const size_t slash = path.rfind('/');
+    const size_t nameStart = slash == std::string::npos ? 0 : slash + 1;
     const size_t dot = path.rfind('.');
-    std::string base = (dot != std::string::npos && dot >= nameStart) ? path.substr(0, dot) : path;
-    return base + ".csc";
+    const bool inFileName = dot != std::string::npos && dot >= nameStart;
+    return (inFileName ? path.substr(0, dot) : path) + ".csc";
 }
 
 namespace {

@@ -201,6 +201,7 @@ INSTANTIATE_TEST_SUITE_P(
                       PathCase{"/My.Folder/PICS/house", "/My.Folder/PICS/house.csc"},
                       PathCase{"/My.Folder/v1.2/house.v2", "/My.Folder/v1.2/house.csc"},
                       PathCase{"/a.b/", "/a.b/.csc"},
+                      PathCase{"/p/.hidden", "/p/.csc"},
                       PathCase{"house.", "house.csc"},
                       PathCase{"house", "house.csc"}));
 
