@@ -55,6 +55,7 @@ void TintrollaForm::SaveWork() {
             return;
     }
 
+    commitRename();  // a box name being typed belongs to the saved scheme
     RefreshPicture();
     QString error;
     if (!writeWorkFiles(base, error)) {
@@ -88,9 +89,9 @@ bool TintrollaForm::writeWorkFiles(const QString& base, QString& error) {
         return false;
     }
 
-    // The scheme writer names its own file: give it a hidden name without a
-    // dot, so it writes "<name>.csc" there, and move that into place with the rest.
-    const QString schemeTemp = store::StripTrailingBackslash(PicsPath) + QStringLiteral("/.~scheme-%1-%2")
+    // The scheme writer names its own file: give it a temporary name without
+    // any dot, so it writes "<name>.csc", and move that into place with the rest.
+    const QString schemeTemp = store::StripTrailingBackslash(PicsPath) + QStringLiteral("/~scheme-%1-%2")
                                    .arg(QCoreApplication::applicationPid())
                                    .arg(QRandomGenerator::global()->generate(), 8, 16, QLatin1Char('0'));
     const QString previousScheme = SchemeFileName;
