@@ -1,11 +1,11 @@
 #pragma once
-#include <QImage>
+#include <QPainter>
+#include <QRect>
+#include <functional>
 
 #include "paint/Picture.h"
 
-// Lets QPainter draw straight into a picture buffer. A picture holds
-// red + 256 x green + 65536 x blue with a zero top byte; the wrapper sees the
-// same memory as RGBX bytes. Drawing sets the top byte, so SealPicture must
-// run once the painter is done to give the engine clean colour values again.
-QImage WrapPicture(Picture& picture);
-void SealPicture(Picture& picture);
+// Draws with QPainter onto part of a picture buffer: the region is copied
+// into an image, drawn on in picture coordinates, and copied back. Pixels
+// outside the region are never touched.
+void PaintPicture(Picture& picture, const QRect& region, const std::function<void(QPainter&)>& draw);

@@ -72,14 +72,11 @@ void TintrollaForm::DrawTitleScreen() {
     TitleHue::TurnHues(TitleBackgroundOriginal.data(), TitleBackgroundPicture.data(), count, TitleHueTurn);
 
     Picture& screen = workspace().Picture1;
-    {
-        QImage canvas = WrapPicture(screen);
-        QPainter painter(&canvas);
+    PaintPicture(screen, QRect(0, 0, screen.width(), screen.height()), [this](QPainter& painter) {
         painter.setRenderHint(QPainter::SmoothPixmapTransform);
-        painter.drawImage(QRect(0, 0, canvas.width(), canvas.height()), ToQImage(TitleBackgroundPicture));
+        painter.drawImage(QRect(0, 0, Workspace::kWidth, Workspace::kHeight), ToQImage(TitleBackgroundPicture));
         painter.drawImage(QPoint(65, 10), artwork::WindowIconImage());
-    }
-    SealPicture(screen);
+    });
 
     QFont font = Picture1->font();
     SetFace(font, true);
@@ -119,16 +116,17 @@ void TintrollaForm::DrawTitleScreen() {
 // Text at (x, y): the top of the text line at y, in the work picture's font
 // and text colour.
 void TintrollaForm::PrintAt(int x, int y, const QString& text) {
-    Picture& screen = workspace().Picture1;
-    {
-        QImage canvas = WrapPicture(screen);
-        QPainter painter(&canvas);
+    const QFont font = Picture1->font();
+    const QFontMetrics metrics(font);
+    const QPoint baseline(x, y + metrics.ascent());
+    // Only the text's own box is redrawn (with room for italic overhang).
+    const QRect box = metrics.boundingRect(text).translated(baseline).adjusted(-4, -2, 4, 2);
+    PaintPicture(workspace().Picture1, box, [&](QPainter& painter) {
         painter.setRenderHint(QPainter::TextAntialiasing);
-        painter.setFont(Picture1->font());
+        painter.setFont(font);
         painter.setPen(Picture1->palette().color(QPalette::WindowText));
-        painter.drawText(QPoint(x, y + QFontMetrics(Picture1->font()).ascent()), text);
-    }
-    SealPicture(screen);
+        painter.drawText(baseline, text);
+    });
 }
 
 // Back to the title screen: the next poll finds no picture and draws it. The
