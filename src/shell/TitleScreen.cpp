@@ -1,8 +1,8 @@
-#include <QAction>
 #include <QFont>
 #include <QFontMetrics>
 #include <QPainter>
 #include <QTimer>
+#include <cmath>
 
 #include "imaging/TitleHue.h"
 #include "paint/qt/PictureView.h"
@@ -44,17 +44,22 @@ Picture PictureFrom(const QImage& image) {
     return picture;
 }
 
-const char* const kIntroduction[][2] = {
-    {"70", "Have you ever painted your house, and hated it!"},
-    {"85", "Well, never again.  Just \"Tint-Rolla\" first."},
-    {"110", "Take a photo of your home, choose a color scheme and roll on the"},
-    {"125", "new colors.  You don't need to be an artist as \"Tint-rolla\" will"},
-    {"140", "do the rest."},
-    {"165", "You can change the color scheme as often as you like."},
-    {"180", "\"Tint-Rolla\" follows edges and retains existing lighting and shadows."},
-    {"205", "Simple tools include wet or dry paint on a wide or narrow roller"},
-    {"220", "Use a chalk line to markup a picture rail or other tricky detail."},
-    {"235", "Then you can SAVE-it and PRINT-it."},
+struct Line {
+    int y;
+    const char* text;
+};
+
+const Line kIntroduction[] = {
+    {70, "Have you ever painted your house, and hated it!"},
+    {85, "Well, never again.  Just \"Tint-Rolla\" first."},
+    {110, "Take a photo of your home, choose a color scheme and roll on the"},
+    {125, "new colors.  You don't need to be an artist as \"Tint-rolla\" will"},
+    {140, "do the rest."},
+    {165, "You can change the color scheme as often as you like."},
+    {180, "\"Tint-Rolla\" follows edges and retains existing lighting and shadows."},
+    {205, "Simple tools include wet or dry paint on a wide or narrow roller"},
+    {220, "Use a chalk line to markup a picture rail or other tricky detail."},
+    {235, "Then you can SAVE-it and PRINT-it."},
 };
 } // namespace
 
@@ -96,8 +101,7 @@ void TintrollaForm::DrawTitleScreen() {
     font.setItalic(false);
     font.setPixelSize(PointsToPixels(9));
     Picture1->setFont(font);
-    for (const auto& line : kIntroduction)
-        PrintAt(10, QByteArray(line[0]).toInt(), QString::fromUtf8(line[1]));
+    for (const Line& line : kIntroduction) PrintAt(10, line.y, QString::fromUtf8(line.text));
 
     font.setPixelSize(PointsToPixels(7));
     font.setItalic(true);
