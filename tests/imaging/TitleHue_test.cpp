@@ -65,7 +65,7 @@ TEST(TitleHue, OneStepTurnsHueByTwoKeepingSaturationAndLuminance) {
         }
         // Near white a single unit of red, green or blue is many units of
         // saturation, so saturation is only held where it is well defined.
-        if (before.lum < 230) EXPECT_NEAR(after.sat, before.sat, 2) << std::hex << color;
+        if (before.lum < 230) { EXPECT_NEAR(after.sat, before.sat, 2) << std::hex << color; }
         EXPECT_NEAR(after.lum, before.lum, 1) << std::hex << color;
     }
 }
@@ -103,7 +103,7 @@ TEST(TitleHue, BackgroundComesRoundAfter128Redraws) {
     for (int k = 0; k < 128; ++k) EXPECT_EQ(frames[static_cast<size_t>(k)], frames[static_cast<size_t>(k + 128)]) << k;
     // Half way round every coloured pixel sits opposite its start.
     for (size_t i = 0; i < original.size(); ++i)
-        if (Hsl(original[i]).sat > 20) EXPECT_GE(HueDistance(Hsl(frames[63][i]).hue, Hsl(original[i]).hue), 125) << i;
+        if (Hsl(original[i]).sat > 20) { EXPECT_GE(HueDistance(Hsl(frames[63][i]).hue, Hsl(original[i]).hue), 125) << i; }
 }
 
 TEST(TitleHue, GreysStayGrey) {

@@ -73,7 +73,7 @@ TEST(HelpTopics, TrailingBlanksAndOddEndingsKept) {
     EXPECT_TRUE(seven.ends_with("in the Open File list as (*.BMP)")) << seven;
     // Only topic five ends in blanks.
     for (size_t i = 0; i < HelpTopics().size(); ++i)
-        if (i != 4) EXPECT_FALSE(HelpText(HelpTopics()[i]).ends_with(" ")) << i;
+        if (i != 4) { EXPECT_FALSE(HelpText(HelpTopics()[i]).ends_with(" ")) << i; }
 }
 
 TEST(HelpTopics, ChosenTopicsWordForWord) {

@@ -115,6 +115,7 @@ void MainWindowTest::closeQuestion() {
     QFETCH(bool, saveShown);
     FormFixture f;
     f.form().show();
+    f.ws().PictureLoaded = true;
     f.ws().PictureModified = true;
     f.ws().Stroke(10, 20) = 1;
     f.platform().answers.push_back(static_cast<platform::Answer>(answer));
