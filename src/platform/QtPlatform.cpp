@@ -7,6 +7,7 @@
 #include <QDialog>
 #include <QFileDialog>
 #include <QMessageBox>
+#include <QPalette>
 #include <QPrintDialog>
 #include <QPrinter>
 
@@ -77,7 +78,10 @@ FileChoice QtPlatform::saveFile(QWidget* parent, const FileRequest& r) {
 }
 
 std::optional<int32_t> QtPlatform::chooseColor(QWidget* parent, int32_t start) {
-    const QColor initial((start & 0xFF), (start >> 8) & 0xFF, (start >> 16) & 0xFF);
+    // A box without colour holds the button-face value: start from that colour.
+    const bool none = start == static_cast<int32_t>(0x8000000Fu);
+    const QColor initial = none ? QPalette().color(QPalette::Button)
+                                : QColor(start & 0xFF, (start >> 8) & 0xFF, (start >> 16) & 0xFF);
     QColorDialog dialog(initial, parent);
     if (dialog.exec() != QDialog::Accepted) return std::nullopt;
     const QColor c = dialog.selectedColor();

@@ -14,6 +14,7 @@
 #include "paint/Tools.h"
 #include "paint/qt/PictureView.h"
 #include "scheme/qt/ColorBoxLabel.h"
+#include "shell/WrappingCheckBox.h"
 #include "store/qt/BrowserLists.h"
 
 TintrollaForm::TintrollaForm(platform::Platform& platform, const QString& programFolder, QWidget* parent)
@@ -39,6 +40,10 @@ void TintrollaForm::buildLayout() {
     client = new QWidget(this);
     client->setObjectName(QStringLiteral("client"));
     client->setFixedSize(kClientWidth, kClientHeight);
+    // The controls are laid out for a small dialog font, as on the desktop it came from.
+    QFont small(QStringLiteral("Liberation Sans"));
+    small.setPointSizeF(8.0);
+    client->setFont(small);
     setCentralWidget(client);
 
     Toolbar1 = new QToolBar(client);
@@ -87,7 +92,7 @@ void TintrollaForm::buildLayout() {
     buildBrowser();
 
     auto makeCheck = [this](const char* name, const QString& text, QRect geometry, bool checked) {
-        auto* box = new QCheckBox(text, client);
+        auto* box = new WrappingCheckBox(text, client);
         box->setObjectName(QString::fromLatin1(name));
         box->setGeometry(geometry);
         box->setChecked(checked);
@@ -98,8 +103,6 @@ void TintrollaForm::buildLayout() {
     ExpandEdgesCheckbox = makeCheck("ExpandEdgesCheckbox", QStringLiteral("Expand Edges"), twips(4320, 5280, 1695, 255), true);
     ProtectPaintCheckbox = makeCheck("ProtectPaintCheckbox", QStringLiteral("Protect Painted Areas"), twips(6120, 5280, 2160, 255), true);
     LoadwithPictureCheckbox = makeCheck("LoadwithPictureCheckbox", QStringLiteral("Load Color Scheme with Picture"), twips(8280, 5160, 1785, 435), true);
-    // Two lines high: the caption wraps inside its box.
-    LoadwithPictureCheckbox->setStyleSheet(QStringLiteral("QCheckBox { font-size: 7pt; }"));
 
     // The check boxes are the store of the options; the engine reads its mirror.
     auto mirror = [this](QCheckBox* box, bool Workspace::*field) {
