@@ -95,26 +95,14 @@ TEST(HSLcolor, WholeCubeStaysWholeAndInRange) {
             }
 }
 
-TEST(HSLcolor, SplitAndJoinUseRedInTheLowByte) {
-    const RGB c = SplitColor(0x00336699);
-    EXPECT_EQ(c.red, 0x99);
-    EXPECT_EQ(c.green, 0x66);
-    EXPECT_EQ(c.blue, 0x33);
-    EXPECT_EQ(JoinColor(c), 0x00336699);
-}
-
-struct ThreeCase {
-    float a, b, c, max, min;
-};
-
 TEST(HSLcolor, Max3AndMin3) {
-    const ThreeCase cases[] = {
-        {1, 2, 3, 3, 1}, {3, 2, 1, 3, 1}, {2, 3, 1, 3, 1}, {2, 2, 2, 2, 2}, {0.5f, 0.25f, 0.5f, 0.5f, 0.25f},
-    };
+    const float cases[][5] = {{1, 2, 3, 3, 1}, {3, 2, 1, 3, 1}, {2, 3, 1, 3, 1}, {0.5f, 0.25f, 0.5f, 0.5f, 0.25f}};
     for (const auto& t : cases) {
-        EXPECT_EQ(Max3(t.a, t.b, t.c), t.max);
-        EXPECT_EQ(Min3(t.a, t.b, t.c), t.min);
+        EXPECT_EQ(Max3(t[0], t[1], t[2]), t[3]);
+        EXPECT_EQ(Min3(t[0], t[1], t[2]), t[4]);
     }
+    EXPECT_EQ(JoinColor(SplitColor(0x00336699)), 0x00336699);
+    EXPECT_EQ(SplitColor(0x00336699).red, 0x99);
 }
 
 } // namespace
