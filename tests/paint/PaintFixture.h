@@ -1,18 +1,14 @@
 #pragma once
 // The painting engine's test fixture: a fake window that records what the
-// engine asks of it, and a loaded photo with box 1 ready to paint.
+// engine asks of it, and a sunlit wall with box 1 ready to paint.
 #include <gtest/gtest.h>
 
-#include <cmath>
 #include <memory>
 #include <string>
-#include <utility>
 #include <vector>
 
-#include "imaging/HSLcolor.h"
 #include "paint/PaintEngine.h"
 #include "paint/PhotoArt.h"
-#include "paint/Workspace.h"
 
 namespace painttest {
 
@@ -20,35 +16,28 @@ class FakeHost : public PaintHost {
 public:
     explicit FakeHost(Workspace& ws) : ws_(ws) {}
     void RefreshPicture() override { ++refreshes; }
-    void ToolStateChanged() override { ++toolChanges; }
-    void Warning(const std::string& title, const std::string& text) override { warnings.emplace_back(title, text); }
+    void ToolStateChanged() override {}
+    void Warning(const std::string& title, const std::string& text) override { warnings.push_back(title + "|" + text); }
     void PumpEvents() override { ++pumps; }
-    // What selecting a box does to the drawing state.
     void SelectColorBox(int index) override {
         selected.push_back(index);
         ws_.CurrentColor = static_cast<int16_t>(index);
         LoadDrawColor(ws_, index);
     }
-
-    int refreshes = 0;
-    int toolChanges = 0;
-    int pumps = 0;
-    std::vector<std::pair<std::string, std::string>> warnings;
+    int refreshes = 0, pumps = 0;
+    std::vector<std::string> warnings;  // "title|text"
     std::vector<int> selected;
 
 private:
     Workspace& ws_;
 };
 
-// A loaded photo with box 1 coloured and referenced, the plain options.
 class PaintTest : public ::testing::Test {
 protected:
     PaintTest() : ws_ptr(std::make_unique<Workspace>()), ws(*ws_ptr), host(ws), engine(ws, host) {
         FillPhoto(ws, 'Y');
         ws.PictureLoaded = true;
-        ws.BlendEdges = false;
-        ws.ExpandEdges = false;
-        ws.ProtectPaint = true;
+        ws.BlendEdges = ws.ExpandEdges = false;
         GiveBox(1, HSLcolor::JoinColor(60, 120, 200), HSLcolor::JoinColor(200, 180, 40));
         LoadDrawColor(ws, 1);
     }
@@ -56,12 +45,11 @@ protected:
         ws.Boxes[static_cast<size_t>(i)].color = color;
         ws.Boxes[static_cast<size_t>(i)].reference = reference;
     }
-    // A left-button press and release without moving.
-    void Dab(float x, float y) {
-        engine.MouseDown(kLeftButton, x, y);
-        engine.MouseUp(kLeftButton, x, y);
+    // A press and release without moving.
+    void Dab(float x, float y, int button = kLeftButton) {
+        engine.MouseDown(button, x, y);
+        engine.MouseUp(button, x, y);
     }
-
     std::unique_ptr<Workspace> ws_ptr;
     Workspace& ws;
     FakeHost host;

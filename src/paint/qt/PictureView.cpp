@@ -23,6 +23,9 @@ PictureView::PictureView(QWidget* parent) : QFrame(parent) {
     setFrameStyle(QFrame::Panel | QFrame::Sunken);
     setLineWidth(kBorder);
     setMouseTracking(true);
+    // A click takes the focus (so a box name being typed is committed first);
+    // the press itself still goes to the engine as before.
+    setFocusPolicy(Qt::ClickFocus);
     setAttribute(Qt::WA_OpaquePaintEvent);
 }
 
