@@ -40,20 +40,16 @@ void ClearAllColors(Workspace& ws) {
     }
 }
 
-void ApplyScheme(Workspace& ws, const ColorBoxes& boxes) {
-    for (int i = 1; i <= kColorBoxCount; ++i) {
-        ws.Boxes[i].name = boxes[i].name;
-        ws.Boxes[i].reference = boxes[i].reference;
-        SetNewColor(ws, boxes[i].color, i);
-    }
-}
-
 bool LoadScheme(Workspace& ws, const std::vector<uint8_t>& bytes, std::string& problem) {
     const SchemeFile::Decoded decoded = SchemeFile::Decode(bytes);
     if (!decoded.ok) {
         problem = decoded.problem;
         return false;
     }
-    ApplyScheme(ws, decoded.boxes);
+    for (int i = 1; i <= kColorBoxCount; ++i) {
+        ws.Boxes[i].name = decoded.boxes[i].name;
+        ws.Boxes[i].reference = decoded.boxes[i].reference;
+        SetNewColor(ws, decoded.boxes[i].color, i);
+    }
     return true;
 }

@@ -23,10 +23,8 @@ void SelectBox(Workspace& ws, int i);
 // drawing colour stay as they are.
 void ClearAllColors(Workspace& ws);
 
-// Takes over a whole scheme, box 1 to 12 in order: name, reference, then
-// SetNewColor (so the drawing colour ends up as box 12's).
-void ApplyScheme(Workspace& ws, const ColorBoxes& boxes);
-
-// Decodes a scheme file's bytes and applies them only when the whole file is
-// sound. On failure the boxes are untouched and `problem` says why.
+// Decodes a scheme file's bytes and takes them over only when the whole file
+// is sound: box 1 to 12 in order, name, reference, then SetNewColor (so the
+// drawing colour ends up as box 12's). On failure the boxes are untouched and
+// `problem` says why.
 bool LoadScheme(Workspace& ws, const std::vector<uint8_t>& bytes, std::string& problem);

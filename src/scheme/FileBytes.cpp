@@ -18,7 +18,7 @@ std::string Reason(int err) {
     return std::string(std::strerror(err)) + ".";
 }
 
-// Closes a descriptor when it goes out of scope, unless released.
+// Closes a descriptor when it goes out of scope (unless fd is set back to -1).
 struct Fd {
     int fd = -1;
     ~Fd() {

@@ -8,7 +8,6 @@ class ColorBoxLabel : public QLabel {
     Q_OBJECT
 public:
     ColorBoxLabel(int index, QWidget* parent = nullptr);
-    int index() const { return index_; }
 
     // Paint colour (kButtonFace: the window's button colour), name colour and
     // the flat (selected) or raised look. Repaints only when something changed.

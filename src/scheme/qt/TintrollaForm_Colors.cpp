@@ -90,7 +90,6 @@ void TintrollaForm::PictureColor_MouseDown(int index, int /*button*/) {
     // A rename in progress is committed before anything else happens.
     if (!ColorNameBoxTag.isEmpty()) commitRename();
     SelectBox(workspace(), index);
-    UpdatePictureCursor();
     ToolStateChanged();
 }
 

@@ -13,6 +13,18 @@ namespace {
 std::string LocalPath(const QString& path) { return QFile::encodeName(path).toStdString(); }
 QString FromLocalPath(const std::string& path) { return QFile::decodeName(QByteArray::fromStdString(path)); }
 
+platform::FileRequest SchemeRequest(const QString& title, const QString& filter, const QString& folder,
+                                    const QString& fileName) {
+    platform::FileRequest request;
+    request.defaultExtension = QStringLiteral("*");
+    request.initialFolder = folder;
+    request.fileName = fileName;
+    request.filter = filter;
+    request.title = title;
+    request.flags = 4;
+    return request;
+}
+
 } // namespace
 
 bool TintrollaForm::ReadColorScheme(const QString& path, bool showMessage, QString* problem) {
@@ -51,14 +63,10 @@ bool TintrollaForm::WriteColorScheme(const QString& path, bool showMessage, QStr
 
 void TintrollaForm::LoadSchemeMenuItem_Click() {
     commitRename();  // a name being typed belongs to the scheme being replaced
-    platform::FileRequest request;
-    request.defaultExtension = QStringLiteral("*");
-    request.initialFolder = Dir1 ? Dir1->path() : QString();
-    request.fileName = SchemeFileName;
-    request.filter = QStringLiteral("Colour Schemes (*.CSC)| *.CSC|") + QStringLiteral("All files (*.*)|*.*");
-    request.title = QStringLiteral("Select Colour Scheme");
-    request.flags = 4;
-    const platform::FileChoice choice = platformLayer().openFile(this, request);
+    const platform::FileChoice choice = platformLayer().openFile(
+        this, SchemeRequest(QStringLiteral("Select Colour Scheme"),
+                            QStringLiteral("Colour Schemes (*.CSC)| *.CSC|All files (*.*)|*.*"),
+                            Dir1 ? Dir1->path() : QString(), SchemeFileName));
     if (choice.cancelled || choice.fileName.isEmpty()) return;
     if (!ReadColorScheme(choice.fileName)) return;
     ColorSchemeFrame->update();
@@ -67,14 +75,9 @@ void TintrollaForm::LoadSchemeMenuItem_Click() {
 
 void TintrollaForm::SaveSchemeMenuItem_Click() {
     commitRename();  // the name being typed is saved with the scheme
-    platform::FileRequest request;
-    request.defaultExtension = QStringLiteral("*");
-    request.initialFolder = Dir1 ? Dir1->path() : QString();
-    request.fileName = SchemeFileName;
-    request.filter = QStringLiteral("Colour Scheme (*.CSC)| *.csc");
-    request.title = QStringLiteral("Save Colour Scheme to");
-    request.flags = 4;
-    const platform::FileChoice choice = platformLayer().saveFile(this, request);
+    const platform::FileChoice choice = platformLayer().saveFile(
+        this, SchemeRequest(QStringLiteral("Save Colour Scheme to"), QStringLiteral("Colour Scheme (*.CSC)| *.csc"),
+                            Dir1 ? Dir1->path() : QString(), SchemeFileName));
     if (choice.cancelled || choice.fileName.isEmpty()) return;
     WriteColorScheme(choice.fileName);
 }
