@@ -49,6 +49,27 @@ void SetSmoothed(Workspace& ws, int x, int y, int32_t r, int32_t g, int32_t b) {
     DeriveTonePlanes(ws, x, y);
 }
 
+// An edge pixel: the mean of its own raw colour and its smoothed inner
+// neighbour (nx, ny).
+void SmoothEdge(Workspace& ws, Sums& sums, int x, int y, int nx, int ny) {
+    const HSLcolor::RGB c = Visit(ws, sums, x, y);
+    auto mean2 = [&](int p, int32_t own) { return Nearest((ws.Plane(nx, ny, p) + own) / 2.0); };
+    SetSmoothed(ws, x, y, mean2(0, c.red), mean2(1, c.green), mean2(2, c.blue));
+}
+
+// The contrast step: for x and y from 1 up, planes 0..2 become
+// (2 v - a + 256) mod 256 around the averages; row 0 and column 0 stay, and
+// planes 3..5 keep the values taken before this step.
+bool ApplyContrastStep(Workspace& ws, const PhotoAverages& averages, const std::function<bool()>& yieldAndContinue) {
+    const int32_t avg[3] = {averages.red, averages.green, averages.blue};
+    for (int x = 1; x <= ws.WholeMaxX(); ++x) {
+        if (yieldAndContinue && !yieldAndContinue()) return false;
+        for (int y = 1; y <= ws.WholeMaxY(); ++y)
+            for (int p = 0; p < 3; ++p) ws.Plane(x, y, p) = (2 * ws.Plane(x, y, p) - avg[p] + 256) % 256;
+    }
+    return true;
+}
+
 } // namespace
 
 int32_t HueWave(float hue, float lum) {
@@ -80,40 +101,19 @@ bool AnalysePhoto(Workspace& ws, const std::function<bool()>& yieldAndContinue, 
             SetSmoothed(ws, x, y, mean3(0, c.red), mean3(1, c.green), mean3(2, c.blue));
         }
     }
-    // Pass B, the top row, from the row below.
-    for (int x = 0; x <= maxX; ++x) {
-        const HSLcolor::RGB c = Visit(ws, sums, x, 0);
-        auto mean2 = [&](int p, int32_t own) { return Nearest((ws.Plane(x, 1, p) + own) / 2.0); };
-        SetSmoothed(ws, x, 0, mean2(0, c.red), mean2(1, c.green), mean2(2, c.blue));
-    }
-    // Pass C, the left column, from the column to its right; (0, 0) is
-    // visited a second time and counted twice.
-    for (int y = 0; y <= maxY; ++y) {
-        const HSLcolor::RGB c = Visit(ws, sums, 0, y);
-        auto mean2 = [&](int p, int32_t own) { return Nearest((ws.Plane(1, y, p) + own) / 2.0); };
-        SetSmoothed(ws, 0, y, mean2(0, c.red), mean2(1, c.green), mean2(2, c.blue));
-    }
+    // Pass B, the top row, from the row below; pass C, the left column, from
+    // the column to its right: (0, 0) is visited a second time and counted twice.
+    for (int x = 0; x <= maxX; ++x) SmoothEdge(ws, sums, x, 0, x, 1);
+    for (int y = 0; y <= maxY; ++y) SmoothEdge(ws, sums, 0, y, 1, y);
 
     const double count = sums.count;
     ws.RefLum = static_cast<float>(std::floor(static_cast<double>(sums.refLum) / count));
-    const int32_t avg[3] = {Nearest(sums.red / count), Nearest(sums.green / count), Nearest(sums.blue / count)};
+    const PhotoAverages result{sums.count, Nearest(sums.red / count), Nearest(sums.green / count), Nearest(sums.blue / count)};
     ws.StrokeNumber = 0;
     ws.UndoEnabled = false;
     ws.RedoEnabled = false;
-    if (averages) *averages = PhotoAverages{sums.count, avg[0], avg[1], avg[2]};
-
-    return ApplyContrastStep(ws, PhotoAverages{sums.count, avg[0], avg[1], avg[2]}, yieldAndContinue);
-}
-
-bool ApplyContrastStep(Workspace& ws, const PhotoAverages& averages, const std::function<bool()>& yieldAndContinue) {
-    // Planes 3..5 keep the values taken before this step.
-    const int32_t avg[3] = {averages.red, averages.green, averages.blue};
-    for (int x = 1; x <= ws.WholeMaxX(); ++x) {
-        if (yieldAndContinue && !yieldAndContinue()) return false;
-        for (int y = 1; y <= ws.WholeMaxY(); ++y)
-            for (int p = 0; p < 3; ++p) ws.Plane(x, y, p) = (2 * ws.Plane(x, y, p) - avg[p] + 256) % 256;
-    }
-    return true;
+    if (averages) *averages = result;
+    return ApplyContrastStep(ws, result, yieldAndContinue);
 }
 
 } // namespace store

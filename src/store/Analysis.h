@@ -28,10 +28,6 @@ struct PhotoAverages {
 bool AnalysePhoto(Workspace& ws, const std::function<bool()>& yieldAndContinue,
                   PhotoAverages* averages = nullptr);
 
-// The contrast step alone: for x and y from 1 up, planes 0..2 become
-// (2 v - a + 256) mod 256 around the averages; row 0 and column 0 stay.
-bool ApplyContrastStep(Workspace& ws, const PhotoAverages& averages, const std::function<bool()>& yieldAndContinue);
-
 // The hue wave of plane 4 for a hue and luminance on the 0..255 scales.
 int32_t HueWave(float hue, float lum);
 

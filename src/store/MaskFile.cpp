@@ -7,6 +7,27 @@
 
 namespace store {
 
+namespace {
+// Fills `mask` from the start of `bytes`: whole elements only, never more
+// than the mask holds; elements the bytes do not reach are left alone.
+void DecodePaintMask(const Bytes& bytes, std::vector<int16_t>& mask) {
+    const size_t count = std::min({bytes.size() / 2, mask.size(), kMaskFileSize / 2});
+    for (size_t i = 0; i < count; ++i) {
+        const auto v = static_cast<uint16_t>(bytes[2 * i] | (bytes[2 * i + 1] << 8));
+        mask[i] = static_cast<int16_t>(v);
+    }
+}
+
+// A colour-plane value must name one of the twelve boxes (or none).
+bool ColorPlaneIsValid(const std::vector<int16_t>& mask) {
+    for (size_t i = Workspace::kMaskPlane; i < mask.size(); ++i)
+        if (std::abs(static_cast<int>(mask[i])) > kColorBoxCount) return false;
+    return true;
+}
+
+std::string MaskPathFor(const std::string& path) { return StripExtension(path) + ".msk"; }
+} // namespace
+
 Bytes EncodePaintMask(const std::vector<int16_t>& mask) {
     Bytes bytes(kMaskFileSize, 0);
     const size_t count = std::min(mask.size(), kMaskFileSize / 2);
@@ -17,22 +38,6 @@ Bytes EncodePaintMask(const std::vector<int16_t>& mask) {
     }
     return bytes;
 }
-
-void DecodePaintMask(const Bytes& bytes, std::vector<int16_t>& mask) {
-    const size_t count = std::min({bytes.size() / 2, mask.size(), kMaskFileSize / 2});
-    for (size_t i = 0; i < count; ++i) {
-        const auto v = static_cast<uint16_t>(bytes[2 * i] | (bytes[2 * i + 1] << 8));
-        mask[i] = static_cast<int16_t>(v);
-    }
-}
-
-bool ColorPlaneIsValid(const std::vector<int16_t>& mask) {
-    for (size_t i = Workspace::kMaskPlane; i < mask.size(); ++i)
-        if (std::abs(static_cast<int>(mask[i])) > kColorBoxCount) return false;
-    return true;
-}
-
-std::string MaskPathFor(const std::string& path) { return StripExtension(path) + ".msk"; }
 
 MaskRead ReadPaintMask(Workspace& ws, const std::string& path) {
     Bytes bytes;

@@ -13,13 +13,6 @@ inline constexpr size_t kMaskFileSize = static_cast<size_t>(Workspace::kMaskPlan
 // The mask as the file's bytes.
 Bytes EncodePaintMask(const std::vector<int16_t>& mask);
 
-// Fills `mask` from the start of `bytes`: whole elements only, never more
-// than the mask holds; elements the bytes do not reach are left alone.
-void DecodePaintMask(const Bytes& bytes, std::vector<int16_t>& mask);
-
-// A colour-plane value must name one of the twelve boxes (or none).
-bool ColorPlaneIsValid(const std::vector<int16_t>& mask);
-
 enum class MaskRead { Loaded, Missing, Broken };
 
 // Reads StripExtension(path) & ".msk" into ws.PaintMask. A missing or
@@ -29,7 +22,5 @@ MaskRead ReadPaintMask(Workspace& ws, const std::string& path);
 
 // Writes ws.PaintMask to StripExtension(path) & ".msk", whole or not at all.
 bool WritePaintMask(const Workspace& ws, const std::string& path, std::string& error);
-
-std::string MaskPathFor(const std::string& path);
 
 } // namespace store

@@ -103,21 +103,15 @@ bool GifComplete(std::span<const uint8_t> b) {
 }
 } // namespace
 
-PictureKind KindOf(std::span<const uint8_t> h) {
-    if (h.size() >= 3 && h[0] == 0xFF && h[1] == 0xD8 && h[2] == 0xFF) return PictureKind::Jpeg;
-    if (h.size() >= 2 && h[0] == 'B' && h[1] == 'M') return PictureKind::Bmp;
-    if (h.size() >= 6 && h[0] == 'G' && h[1] == 'I' && h[2] == 'F') return PictureKind::Gif;
-    return PictureKind::Unknown;
-}
-
-std::string CheckComplete(std::span<const uint8_t> file) {
+std::string CheckComplete(std::span<const uint8_t> b) {
+    // The kind is told by the first bytes, whatever the file's name says.
     bool complete = true;
-    switch (KindOf(file)) {
-    case PictureKind::Jpeg: complete = JpegComplete(file); break;
-    case PictureKind::Bmp: complete = BmpComplete(file); break;
-    case PictureKind::Gif: complete = GifComplete(file); break;
-    case PictureKind::Unknown: break;
-    }
+    if (b.size() >= 3 && b[0] == 0xFF && b[1] == 0xD8 && b[2] == 0xFF)
+        complete = JpegComplete(b);
+    else if (b.size() >= 2 && b[0] == 'B' && b[1] == 'M')
+        complete = BmpComplete(b);
+    else if (b.size() >= 6 && b[0] == 'G' && b[1] == 'I' && b[2] == 'F')
+        complete = GifComplete(b);
     return complete ? std::string() : std::string(kTruncated);
 }
 

@@ -100,9 +100,4 @@ bool ReadFileHead(const std::string& path, size_t limit, Bytes& bytes) {
     return true;
 }
 
-bool FileExists(const std::string& path) {
-    struct stat st {};
-    return ::stat(path.c_str(), &st) == 0 && S_ISREG(st.st_mode);
-}
-
 } // namespace store

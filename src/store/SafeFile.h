@@ -30,6 +30,4 @@ bool WriteFileSafely(const std::string& path, const Bytes& bytes, std::string& e
 // Reads at most `limit` bytes of a file. False when it cannot be opened or read.
 bool ReadFileHead(const std::string& path, size_t limit, Bytes& bytes);
 
-bool FileExists(const std::string& path);
-
 } // namespace store

@@ -35,12 +35,12 @@ public:
     bool setPath(const QString& path);
     // The folder of the highlighted entry; empty when none is highlighted.
     QString highlightedPath() const;
-    static QString pathOf(const QListWidgetItem* item);
 
 signals:
     void pathChanged();
 
 private:
+    static QString pathOf(const QListWidgetItem* item);
     QString path_;
 };
 
@@ -52,7 +52,6 @@ public:
     explicit FileListBox(QWidget* parent = nullptr);
     QString path() const { return path_; }
     void setPath(const QString& path);
-    QString pattern() const { return pattern_; }
     void setPattern(const QString& pattern);
     void reread();
     QStringList entries() const;
@@ -60,7 +59,6 @@ public:
     QString selectedName() const;
     // Selects the first entry equal to `name` ignoring case; false when none.
     bool selectName(const QString& name);
-    static bool matches(const QString& name, const QString& pattern);
 
 signals:
     void fileClicked();  // a click, or the keyboard moving the selection
@@ -69,6 +67,7 @@ protected:
     void keyPressEvent(QKeyEvent* event) override;
 
 private:
+    static bool matches(const QString& name, const QString& pattern);
     QString path_;
     QString pattern_;
 };
