@@ -2,128 +2,43 @@
 
 #include <gtest/gtest.h>
 
-#include <set>
-#include <string>
+#include <algorithm>
 
-namespace {
-const HelpTopic* Find(std::string_view control) {
-    for (const HelpTopic& t : HelpTopics())
-        if (t.control == control) return &t;
-    return nullptr;
-}
-
-std::vector<std::string> Split(const std::string& text) {
-    std::vector<std::string> lines;
-    size_t start = 0;
-    for (size_t at; (at = text.find("\r\n", start)) != std::string::npos; start = at + 2)
-        lines.push_back(text.substr(start, at - start));
-    lines.push_back(text.substr(start));
-    return lines;
-}
-} // namespace
-
-TEST(HelpTopics, FourteenTopicsWithDistinctControls) {
+TEST(HelpTopics, FourteenTopicsWithPairedBreaksAndBlankLinesOnlyInSixAndFourteen) {
     ASSERT_EQ(HelpTopics().size(), 14u);
-    std::set<std::string_view> controls;
-    for (const HelpTopic& t : HelpTopics()) {
-        EXPECT_TRUE(controls.insert(t.control).second) << t.control;
-        EXPECT_TRUE(t.control.ends_with("MenuItem") || t.control.ends_with("menuItem")) << t.control;
-        EXPECT_FALSE(t.caption.empty());
-        EXPECT_FALSE(t.title.empty());
+    for (size_t i = 0; i < 14; ++i) {
+        const std::string text = HelpText(HelpTopics()[i]);
+        // Every break is a "\r\n" pair, and none ends the text.
+        const auto breaks = static_cast<long>(HelpTopics()[i].lines.size()) - 1;
+        EXPECT_EQ(std::count(text.begin(), text.end(), '\n'), breaks) << i;
+        EXPECT_EQ(std::count(text.begin(), text.end(), '\r'), breaks) << i;
+        EXPECT_FALSE(text.ends_with("\r\n")) << i;
+        EXPECT_EQ(text.find("\r\n\r\n") != std::string::npos, i == 5 || i == 13) << i;
+        // Only topic five ends in blanks.
+        EXPECT_EQ(text.ends_with(" "), i == 4) << i;
     }
-    EXPECT_EQ(HelpTopics().front().control, "UsingTintrollaMenuItem");
-    EXPECT_EQ(HelpTopics().back().control, "WhyPrintoutDifferentColorMenuItem");
-}
-
-TEST(HelpTopics, TextsAreLinesJoinedWithoutATrailingBreak) {
-    for (const HelpTopic& t : HelpTopics()) {
-        const std::string text = HelpText(t);
-        EXPECT_FALSE(text.ends_with("\r\n")) << t.control;
-        EXPECT_FALSE(text.starts_with("\r\n")) << t.control;
-        // No bare line feeds or carriage returns: every break is a pair.
-        const auto lines = Split(text);
-        ASSERT_EQ(lines.size(), t.lines.size()) << t.control;
-        for (const std::string& line : lines) {
-            EXPECT_EQ(line.find('\n'), std::string::npos) << t.control;
-            EXPECT_EQ(line.find('\r'), std::string::npos) << t.control;
-        }
-    }
-}
-
-TEST(HelpTopics, EmptyLinesOnlyInTopicsSixAndFourteen) {
-    const auto topics = HelpTopics();
-    for (size_t i = 0; i < topics.size(); ++i) {
-        const std::string text = HelpText(topics[i]);
-        const bool blank = text.find("\r\n\r\n") != std::string::npos;
-        EXPECT_EQ(blank, i == 5 || i == 13) << topics[i].control;
-    }
-    const auto six = Split(HelpText(topics[5]));
-    ASSERT_EQ(six.size(), 13u);
-    EXPECT_EQ(six[6], "");
-    const auto fourteen = Split(HelpText(topics[13]));
-    ASSERT_EQ(fourteen.size(), 12u);
-    EXPECT_EQ(fourteen[4], "");
-    EXPECT_EQ(fourteen[9], "");
-}
-
-TEST(HelpTopics, TrailingBlanksAndOddEndingsKept) {
-    const std::string five = HelpText(HelpTopics()[4]);
-    EXPECT_TRUE(five.ends_with("Color names are saved with the color scheme.  ")) << five;
-    const std::string seven = HelpText(HelpTopics()[6]);
-    EXPECT_TRUE(seven.ends_with("in the Open File list as (*.BMP)")) << seven;
-    // Only topic five ends in blanks.
-    for (size_t i = 0; i < HelpTopics().size(); ++i)
-        if (i != 4) { EXPECT_FALSE(HelpText(HelpTopics()[i]).ends_with(" ")) << i; }
 }
 
 TEST(HelpTopics, ChosenTopicsWordForWord) {
-    const HelpTopic* scheme = Find("WhatisaColourSchemeMenuItem");
-    ASSERT_NE(scheme, nullptr);
-    EXPECT_EQ(scheme->caption, "What is a Color Scheme?");
-    EXPECT_EQ(scheme->title, "What is a Color Scheme?");
-    EXPECT_EQ(HelpText(*scheme),
-              "This is your chosen group of colors for repainting the photo.\r\n"
-              "You can choose a NEW color or PICKUP a color from the photo.\r\n"
-              "You can rename a color by clicking the right mouse button.\r\n"
-              "The Color Scheme is SAVED with the edited photo.");
-
-    const HelpTopic* eraser = Find("UsingtheEraserMenuItem");
-    ASSERT_NE(eraser, nullptr);
-    EXPECT_EQ(eraser->caption, "Using the Eraser");
-    EXPECT_EQ(eraser->title, "Using the Eraser.");
-    EXPECT_EQ(HelpText(*eraser),
-              "It is sometimes necessary to erase small areas of repainted color.\r\n"
-              "To use the eraser tool press-and-hold the right mouse button.\r\n"
-              "The eraser Icon appears.  Move the mouse over the area of paint to\r\n"
-              "be removed from the Paint Mask.");
-
-    const HelpTopic* reference = Find("WhatIsSetReferanceToolMenuItem");
-    ASSERT_NE(reference, nullptr);
-    EXPECT_EQ(reference->caption, "What is the \"Set Referance\" tool?");
-    EXPECT_EQ(reference->title, "What is the \"Set referance\" tool?");
-    EXPECT_TRUE(HelpText(*reference).starts_with(
-        "So that lighting and shadows can show through a recolored\r\n"
-        "area, a luminance referance is used to set the shade of the\r\n"));
-    EXPECT_NE(HelpText(*reference).find("\r\narea.\r\n\r\nSelect the \"Set Referance\" tool and a gray scale icon will\r\n"),
-              std::string::npos);
-
-    const HelpTopic* first = Find("UsingTintrollaMenuItem");
-    ASSERT_NE(first, nullptr);
-    EXPECT_EQ(first->caption, "Using Tint-Rolla");
-    EXPECT_EQ(first->title, "Using \"Tint-Rolla\"");
-
-    const HelpTopic* protect = Find("WhyUseProtectPaintedAreasMenuItem");
-    ASSERT_NE(protect, nullptr);
-    EXPECT_EQ(protect->title, "Why use the \"Protected Painted Areas\" feature?");
-    EXPECT_EQ(HelpText(*protect),
-              "This just makes repainting easy.  With this feature turned ON\r\n"
-              "you can not accidently overpaint an area which has already been repainted.\r\n"
-              "If a painting mistake is made you can use the UNDO or ERASER features to\r\n"
-              "correct it, or turn the \"Protect-Painted-Areas\" feature OFF.");
-
-    const HelpTopic* open = Find("ThetwoFacesofOpenMenuItem");
-    ASSERT_NE(open, nullptr);
-    EXPECT_EQ(open->caption, "The \"two faces\" of OPEN");
-    EXPECT_NE(HelpText(*open).find("and leaves the currrent Color Scheme.  \"Tint-Rolla\" automatically assumes"),
-              std::string::npos);
+    // how: '=' the whole text, '>' its ending, '~' somewhere inside.
+    const struct { size_t index; const char *control, *caption, *title; char how; const char* text; } rows[] = {
+        {1, "WhatisaColourSchemeMenuItem", "What is a Color Scheme?", "What is a Color Scheme?", '=',
+         "This is your chosen group of colors for repainting the photo.\r\nYou can choose a NEW color or PICKUP a color from the "
+         "photo.\r\nYou can rename a color by clicking the right mouse button.\r\nThe Color Scheme is SAVED with the edited photo."},
+        {3, "UsingtheEraserMenuItem", "Using the Eraser", "Using the Eraser.", '~', "button.\r\nThe eraser Icon appears.  Move the mouse"},
+        {4, "HowDoIrenameColorBoxMenuItem", "How do I rename a Color box?", "How do I rename a Color Box?", '>',
+         "\r\nColor names are saved with the color scheme.  "},
+        {5, "WhatIsSetReferanceToolMenuItem", "What is the \"Set Referance\" tool?", "What is the \"Set referance\" tool?", '~',
+         "\r\narea.\r\n\r\nSelect the \"Set Referance\" tool and a gray scale icon will\r\n"},
+        {6, "WhatisthePICSfolderMenuItem", "What is the \"PICS\" folder?", "What is the PICS folder ?", '>', "in the Open File list as (*.BMP)"},
+        {7, "ThetwoFacesofOpenMenuItem", "The \"two faces\" of OPEN", "The two faces of OPEN.", '~', "currrent Color Scheme.  \"Tint-Rolla\" automatically"},
+    };
+    for (const auto& r : rows) {
+        const HelpTopic& topic = HelpTopics()[r.index];
+        EXPECT_EQ(std::string(topic.control) + "|" + std::string(topic.caption) + "|" + std::string(topic.title),
+                  std::string(r.control) + "|" + r.caption + "|" + r.title);
+        const std::string text = HelpText(topic);
+        const bool ok = r.how == '=' ? text == r.text : r.how == '>' ? text.ends_with(r.text) : text.find(r.text) != std::string::npos;
+        EXPECT_TRUE(ok) << r.index << ": " << text;
+    }
 }
