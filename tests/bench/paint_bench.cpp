@@ -2,25 +2,18 @@
 // areas: one roller application, the whole-picture passes and the refresh.
 #include <benchmark/benchmark.h>
 
-#include "imaging/HSLcolor.h"
-#include "paint/PaintEngine.h"
-#include "store/Analysis.h"
+#include "paint/PhotoArt.h"
 
 namespace {
 
-struct NullHost : PaintHost {
-    void RefreshPicture() override {}
-    void ToolStateChanged() override {}
-    void Warning(const std::string&, const std::string&) override {}
-    void PumpEvents() override {}
-    void SelectColorBox(int) override {}
-};
+using namespace painttest;
+using HSLcolor::JoinColor;
 
-// Sky, a wall lit from the left with a dark window, and a lawn, with a little
-// grain so that the roller meets real tolerances; boxes 1..3 rolled over them.
+// Sky and a wall lit from the left with a dark window, with a little grain so
+// that the roller meets real tolerances; boxes 1..3 paint bands of it.
 struct House {
     Workspace ws;
-    NullHost host;
+    FakeHost host{ws};
     PaintEngine engine{ws, host};
     House() {
         uint32_t seed = 12345;
@@ -29,24 +22,17 @@ struct House {
                 seed = seed * 1664525u + 1013904223u;
                 const int g = static_cast<int>(seed >> 29), light = 60 - x / 8;
                 const bool window = y >= 120 && y < 180 && x >= 60 && x < 120;
-                ws.Picture2.setPixel(x, y, y < 60 ? HSLcolor::JoinColor(110 + y + g, 160 + g, 230)
-                                           : y >= 260 ? HSLcolor::JoinColor(60 + g, 140 - (y - 260), 50)
-                                           : window ? HSLcolor::JoinColor(40 + g, 50, 70)
-                                                    : HSLcolor::JoinColor(170 + light + g, 150 + light, 110 + light / 2));
+                SetPhotoPixel(ws, x, y, y < 60   ? JoinColor(110 + y + g, 160 + g, 230)
+                                        : window ? JoinColor(40 + g, 50, 70)
+                                                 : JoinColor(170 + light + g, 150 + light, 110 + light / 2));
             }
-        store::AnalysePhoto(ws, [] { return true; });
-        ws.Picture1 = ws.Image1 = ws.Picture2;
         ws.PictureLoaded = true;
         for (int box = 1; box <= 3; ++box) {
-            ws.Boxes[static_cast<size_t>(box)].color = HSLcolor::JoinColor(80 * box, 200, 120);
-            ws.CurrentColor = static_cast<int16_t>(box);
-            LoadDrawColor(ws, box);
-            for (int y = 30 + 60 * (box - 1); y < 90 + 60 * (box - 1); y += 30) {
-                engine.MouseDown(kLeftButton, 10, static_cast<float>(y));
-                for (int x = 10; x < 400; x += 30) engine.MouseMove(kLeftButton, static_cast<float>(x), static_cast<float>(y));
-                engine.MouseUp(kLeftButton, 390, static_cast<float>(y));
-            }
+            ws.Boxes[static_cast<size_t>(box)] = {"", JoinColor(80 * box, 200, 120), JoinColor(180, 160, 110)};
+            DrawMask(ws, Art(70, std::string(400, static_cast<char>('0' + box))), box, 0, 80 * box - 70);
         }
+        ws.StrokeNumber = 3;
+        engine.RefreshAll();
     }
 };
 
@@ -55,21 +41,20 @@ House& Scene() {
     return house;
 }
 
-// One application (wide or narrow) on the lawn from a fresh seed.
+// One application, wide (1) or narrow (0), on the wall from a fresh seed.
 void BM_Roller(benchmark::State& state) {
-    House& h = Scene();
-    const std::vector<int16_t> mask = h.ws.PaintMask;
-    h.ws.WideRoller = state.range(0) != 0;
+    Workspace& ws = Scene().ws;
+    const std::vector<int16_t> mask = ws.PaintMask;
+    ws.WideRoller = state.range(0) != 0;
     for (auto _ : state) {
         state.PauseTiming();
-        h.ws.PaintMask = mask;
-        h.ws.Stroke(200, 280) = static_cast<int16_t>(h.ws.StrokeNumber);
-        h.ws.ColorPlane(200, 280) = h.ws.CurrentColor;
-        for (int i = 0; i < 6; ++i) h.ws.MatchColor[static_cast<size_t>(i)] = static_cast<float>(h.ws.Plane(200, 280, i));
+        ws.PaintMask = mask;
+        DrawMask(ws, {"9"}, 1, 200, 270);
+        for (int i = 0; i < 6; ++i) ws.MatchColor[static_cast<size_t>(i)] = static_cast<float>(ws.Plane(200, 270, i));
         state.ResumeTiming();
-        h.engine.RollerAt(200, 280);
+        Scene().engine.RollerAt(200, 270);
     }
-    h.ws.PaintMask = mask;
+    ws.PaintMask = mask;
 }
 
 void BM_RenderEdgesBlend(benchmark::State& state) { for (auto _ : state) Scene().engine.RenderEdges(2); }
