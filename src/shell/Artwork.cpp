@@ -37,16 +37,6 @@ CursorArt CursorArtFor(PictureCursor cursor) {
 }
 } // namespace
 
-const QStringList& ToolbarImageKeys() {
-    static const QStringList keys = {
-        QStringLiteral("Open"), QStringLiteral("Save"), QStringLiteral("Delete"), QStringLiteral("Undo"),
-        QStringLiteral("Redo"), QStringLiteral("SmRollerT"), QStringLiteral("LgRollerT"), QStringLiteral("Print"),
-        QStringLiteral("NewColourT"), QStringLiteral("DropperT"), QStringLiteral("SetRefPointT"),
-        QStringLiteral("DryRollerT1"), QStringLiteral("NormalRollerT"), QStringLiteral("WetRollerT1"),
-        QStringLiteral("ChalkLineT"), QStringLiteral("PicsIconT"), QStringLiteral("DeskIconT")};
-    return keys;
-}
-
 QIcon ToolbarImage(const QString& key) {
     InitArtworkResources();
     // QIcon finds "name@2x.png" beside "name.png" by itself.

@@ -4,7 +4,6 @@
 #include <QImage>
 #include <QPoint>
 #include <QString>
-#include <QStringList>
 
 #include "paint/Workspace.h"
 
@@ -12,8 +11,6 @@
 // work picture's cursor icons, the window icon and the title background.
 namespace artwork {
 
-// The image list of the toolbar, in its order.
-const QStringList& ToolbarImageKeys();
 // A toolbar image by key ("Open", "SmRollerT", ...), with its 2x rendering.
 QIcon ToolbarImage(const QString& key);
 

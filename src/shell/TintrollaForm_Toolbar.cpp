@@ -44,8 +44,7 @@ void TintrollaForm::buildToolbar() {
     setWindowIcon(artwork::WindowIcon());
     auto* paintGroup = new QActionGroup(Toolbar1);
     auto* sizeGroup = new QActionGroup(Toolbar1);
-    paintGroup->setExclusive(true);
-    sizeGroup->setExclusive(true);
+    // Both groups are exclusive (the default): one button down in each.
     for (const ToolbarButton& b : kButtons) {
         const QString key = QString::fromLatin1(b.key);
         if (b.separatorBefore) Toolbar1->addSeparator();
