@@ -12,12 +12,8 @@ protected:
         DrawPhoto(ws, Art(Workspace::kHeight, std::string(Workspace::kWidth, 'Y')));
         ws.PictureLoaded = true;
         ws.BlendEdges = ws.ExpandEdges = false;
-        GiveBox(1, HSLcolor::JoinColor(60, 120, 200), HSLcolor::JoinColor(200, 180, 40));
+        ws.Boxes[1] = {"", HSLcolor::JoinColor(60, 120, 200), HSLcolor::JoinColor(200, 180, 40)};
         LoadDrawColor(ws, 1);
-    }
-    void GiveBox(int i, int32_t color, int32_t reference) {
-        ws.Boxes[static_cast<size_t>(i)].color = color;
-        ws.Boxes[static_cast<size_t>(i)].reference = reference;
     }
     // A press and release without moving.
     void Dab(float x, float y) {

@@ -8,6 +8,7 @@
 
 #include "imaging/HSLcolor.h"
 #include "paint/PaintEngine.h"
+#include "store/Analysis.h"
 
 namespace painttest {
 
@@ -18,8 +19,6 @@ inline int32_t Swatch(char c) {
     switch (c) {
     case 'R': return HSLcolor::JoinColor(200, 40, 30);   // brick
     case 'B': return HSLcolor::JoinColor(30, 60, 190);   // blue door
-    case 'G': return HSLcolor::JoinColor(40, 160, 60);   // hedge
-    case 'y': return HSLcolor::JoinColor(150, 135, 25);  // the wall in shade
     default: return HSLcolor::JoinColor(220, 200, 40);   // sunlit wall
     }
 }
@@ -32,10 +31,9 @@ inline void SetPhotoPixel(Workspace& ws, int x, int y, int32_t color) {
     ws.Image1.setPixel(x, y, color);
     const HSLcolor::RGB c = HSLcolor::SplitColor(color);
     const HSLcolor::HSL h = HSLcolor::RGBToHSL(c);
-    const double wave = (std::sin(h.hue / 256.0 * 360.0 * 3.14159 / 180.0) * 127.0 + 128.0) *
-                        (1.0 - (1.0 / (h.lum + 1.0)) / 1000.0);
-    const double planes[] = {c.red, c.green, c.blue, h.lum, std::nearbyint(wave), h.sat};
-    for (int p = 0; p < 6; ++p) ws.Plane(x, y, p) = static_cast<int32_t>(planes[p]);
+    const int32_t planes[] = {c.red, c.green, c.blue, static_cast<int32_t>(h.lum), store::HueWave(h.hue, h.lum),
+                              static_cast<int32_t>(h.sat)};
+    for (int p = 0; p < 6; ++p) ws.Plane(x, y, p) = planes[p];
     ws.Luma(x, y) = static_cast<int32_t>(std::nearbyint(c.green * 0.5882 + c.red * 0.298 + c.blue * 0.1098));
 }
 
@@ -73,24 +71,21 @@ inline int CountStroke(const Workspace& ws, int value) {
     return static_cast<int>(std::count(ws.PaintMask.begin(), ws.PaintMask.begin() + Workspace::kMaskPlane, value));
 }
 
-class FakeHost : public PaintHost {
-public:
-    explicit FakeHost(Workspace& ws) : ws_(ws) {}
+struct FakeHost : PaintHost {
+    explicit FakeHost(Workspace& workspace) : ws(workspace) {}
     void RefreshPicture() override { ++refreshes; }
     void ToolStateChanged() override {}
     void Warning(const std::string& title, const std::string& text) override { warnings.push_back(title + "|" + text); }
     void PumpEvents() override { ++pumps; }
     void SelectColorBox(int index) override {
         selected.push_back(index);
-        ws_.CurrentColor = static_cast<int16_t>(index);
-        LoadDrawColor(ws_, index);
+        ws.CurrentColor = static_cast<int16_t>(index);
+        LoadDrawColor(ws, index);
     }
+    Workspace& ws;
     int refreshes = 0, pumps = 0;
     std::vector<std::string> warnings;  // "title|text"
     std::vector<int> selected;
-
-private:
-    Workspace& ws_;
 };
 
 } // namespace painttest

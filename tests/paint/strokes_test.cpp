@@ -1,0 +1,197 @@
+// The roller, the stroke counter's limit, and undo and redo.
+#include <array>
+#include <utility>
+
+#include "paint/PaintFixture.h"
+
+using namespace painttest;
+
+namespace {
+
+// A blue pixel alone in a sunlit wall: ring 1 finds nothing close to blue, so
+// only the seed is painted. Positions go to the nearest pixel, ties to even.
+TEST_F(PaintTest, PressOnALonePixelPaintsOnlyThatPixel) {
+    SetPhotoPixel(ws, 20, 10, Swatch('B'));
+    for (auto [x, y] : {std::pair{20.0f, 10.0f}, {20.5f, 10.0f}, {19.5f, 9.5f}, {20.49f, 10.5f}}) {
+        ws.ClearMask();
+        engine.MouseDown(kLeftButton, x, y);
+        EXPECT_EQ(MaskArt(ws, 1, 18, 9, 5, 3), (Art{".....", "..1..", "....."})) << x << "," << y;
+        EXPECT_EQ(CountStroke(ws, ws.StrokeNumber), 1);
+    }
+    EXPECT_NE(ws.Picture1.pixel(20, 10), Swatch('B'));
+}
+
+// Presses without a paint colour warn (their releases end no stroke or line,
+// so they enable no Undo); presses outside the picture start nothing; pixels,
+// drags and releases outside it never reach the arrays.
+TEST_F(PaintTest, PressesThatStartNothingAndPositionsOutsideThePicture) {
+    const int32_t paint = std::exchange(ws.Boxes[1].color, kButtonFace);
+    for (const bool chalk : {false, true}) {
+        ws.ChalkLineMode = chalk;
+        engine.MouseDown(kLeftButton, 50, 50);
+        engine.MouseUp(kLeftButton, 80, 60);
+    }
+    EXPECT_EQ(host.warnings, Art(2, "Warning - Painting Picture|No Paint color has been set yet."));
+    EXPECT_EQ(std::pair(CountStroke(ws, 0), ws.UndoEnabled), std::pair(401 * 301, false));
+    ws.Boxes[1].color = paint;
+    for (auto [x, y] : {std::pair{-0.6f, 10.0f}, {10.0f, 299.5f}, {5000.0f, 5000.0f}}) Dab(x, y);
+    EXPECT_EQ(std::pair(ws.StrokeNumber, host.warnings.size()), std::pair(0, size_t{2}));
+    DrawMask(ws, {"1"}, 1, 399, 299);
+    for (auto [x, y] : {std::pair{400, 299}, {399, 300}, {-1, 0}, {0, -1}}) EXPECT_FALSE(engine.PaintPixel(x, y));
+    ws.ExpandEdges = ws.BlendEdges = true;
+    engine.MouseDown(kLeftButton, 395, 295);
+    for (auto [x, y] : {std::pair{1000.0f, 1000.0f}, {-1000.0f, 5.0f}, {399.4f, 5000.0f}, {1e9f, -1e9f}})
+        engine.MouseMove(kLeftButton, x, y);
+    engine.MouseUp(kLeftButton, 1e9f, 1e9f);
+    EXPECT_EQ(MaskArt(ws, 0, 400, 0, 1, 301), Art(301, "."));
+    EXPECT_EQ(MaskArt(ws, 0, 0, 300, 401, 1), Art{std::string(401, '.')});
+}
+
+// The candidate (51, 50) beside a painted seed, with MatchColor all `match`:
+// tolerance 18 for planes 0..2 and 12 for 3..5, windows clipped to 0..255;
+// one plane outside its window is forgiven, two are not.
+TEST_F(PaintTest, ColourTestWindows) {
+    const struct { float match; std::array<int32_t, 6> planes; bool painted; } cases[] = {
+        {100, {81, 100, 100, 100, 100, 100}, true}, {100, {100, 100, 100, 100, 100, 87}, true},
+        {100, {81, 100, 100, 87, 100, 100}, false}, {100, {100, 100, 119, 100, 113, 100}, false},
+        {10, {0, 28, 10, 10, 10, 10}, true},        {10, {29, 29, 10, 10, 10, 10}, false},
+        {250, {232, 255, 250, 250, 250, 250}, true}, {250, {231, 231, 250, 250, 250, 250}, false},
+        // the match colour is taken to the nearest whole number first
+        {10.5f, {29, 29, 10, 10, 10, 10}, false},   {11.5f, {30, 30, 12, 12, 12, 12}, true}};
+    ws.StrokeNumber = 1;
+    DrawMask(ws, {"1"}, 1, 50, 50);
+    for (const auto& c : cases) {
+        ws.Stroke(51, 50) = 0;
+        ws.MatchColor.fill(c.match);
+        for (int p = 0; p < 6; ++p) ws.Plane(51, 50, p) = c.planes[static_cast<size_t>(p)];
+        EXPECT_EQ(engine.PaintPixel(51, 50), c.painted) << c.match << " " << c.planes[0] << " " << c.planes[5];
+    }
+}
+
+// On an even wall one press fills the roller's square, clipped, refreshing once.
+TEST_F(PaintTest, OnePressFillsTheRollerSquare) {
+    const struct { bool wide; int x, y, left, top, right, bottom; } cases[] = {
+        {false, 200, 150, 195, 145, 205, 155}, {true, 2, 3, 0, 0, 22, 23}, {false, 399, 299, 394, 294, 399, 299}};
+    for (const auto& c : cases) {
+        ws.WideRoller = c.wide;
+        engine.MouseDown(kLeftButton, static_cast<float>(c.x), static_cast<float>(c.y));
+        EXPECT_EQ(CountStroke(ws, ws.StrokeNumber), (c.right - c.left + 1) * (c.bottom - c.top + 1));
+        EXPECT_EQ(ws.Stroke(c.left, c.top) + ws.Stroke(c.right, c.bottom), 2 * ws.StrokeNumber) << c.x;
+    }
+    EXPECT_EQ(host.refreshes, 3);
+}
+
+TEST_F(PaintTest, RightMostColumnPaintsAndTakesTheReferenceOneInward) {
+    // Column 399 brick: the cross around (398, 100) holds one brick pixel and four of wall.
+    DrawPhoto(ws, Art(300, "R"), 399, 0);
+    ws.Boxes[1].reference = 0;
+    engine.MouseDown(kLeftButton, 399, 100);
+    EXPECT_EQ(ws.RefLum, static_cast<float>((4.0 * ws.Luma(10, 10) + ws.Luma(399, 10)) / 5.0));
+    EXPECT_EQ(MaskArt(ws, 0, 398, 100, 2, 1), (Art{".1"}));
+}
+
+// Box 2 paint at x 190..194 and a chalk line of box 1 down column 205. A press
+// on box 2 still starts a stroke; with protection it keeps its box and nothing
+// spreads from it, and a press at x = 200 stops at the chalk.
+class Protect : public PaintTest, public ::testing::WithParamInterface<bool> {};
+
+TEST_P(Protect, DecidesWhatTheRollerMayRepaint) {
+    ws.ProtectPaint = GetParam();
+    DrawMask(ws, Art(21, "11111"), 2, 190, 140);
+    DrawMask(ws, Art(300, "#"), 1, 205, 0);
+    ws.StrokeNumber = 1;
+    ws.RedoEnabled = true;
+    Dab(192, 150);
+    EXPECT_EQ(std::tuple(ws.StrokeNumber, ws.RedoEnabled, CountStroke(ws, 2)),
+              std::tuple(2, false, GetParam() ? 0 : 41 * 41));
+    Dab(200, 150);
+    EXPECT_EQ(MaskArt(ws, 1, 188, 150, 20, 1), (Art{GetParam() ? "11222221111111111a.." : "11111111111111111111"}));
+}
+
+INSTANTIATE_TEST_SUITE_P(Options, Protect, ::testing::Bool());
+
+// At the largest number the 16-bit stroke plane holds, a roller press, a chalk
+// line, the eraser and a redo each refuse with a message and write nothing.
+TEST_F(PaintTest, StrokeNumberNeverWraps) {
+    ws.StrokeNumber = Workspace::kMaxStrokeNumber - 1;
+    Dab(100, 100);  // the last number is still painted
+    ws.Stroke(300, 200) = -32768;  // a redo step that could never be taken
+    const Workspace was = ws;
+    Dab(100, 100);
+    for (auto [button, chalk] : {std::pair{kLeftButton, true}, {kRightButton, false}}) {
+        ws.ChalkLineMode = chalk;
+        engine.MouseDown(button, 100, 100);
+        engine.MouseUp(button, 104, 102);
+    }
+    engine.RedoStroke();
+    EXPECT_EQ(host.warnings, Art(4, std::string(kPaintingTitle) + "|" + kTooManyStrokesText));
+    EXPECT_EQ(std::tuple(ws.StrokeNumber, ws.PaintMask, ws.Picture1), std::tuple(32767, was.PaintMask, was.Picture1));
+    EXPECT_EQ(CountStroke(ws, 32767), 41 * 41);
+}
+
+// --- Undo and redo over 7 x 7 blocks A..E of door blue and brick on the
+// wall: one wide press in a block paints exactly that block, and the eraser
+// at its centre clears exactly that block.
+class Undo : public PaintTest {
+protected:
+    Undo() {
+        for (int b = 0; b < 5; ++b) DrawPhoto(ws, Art(7, std::string(7, "BRBRB"[b])), 10 + 40 * b, 10);
+        ws.Boxes[2] = {"", HSLcolor::JoinColor(200, 30, 90), HSLcolor::JoinColor(200, 180, 40)};
+    }
+    // A..E paint a block and a..e erase it, u undoes, r redoes, c clears all,
+    // L draws a chalk line, P turns protection off and goes on with box 2.
+    void Run(const std::string& script) {
+        for (const char s : script) {
+            ws.ChalkLineMode = s == 'L';
+            if (s == 'u') engine.UndoStroke();
+            else if (s == 'r') engine.RedoStroke();
+            else if (s == 'c') engine.ClearAll();
+            else if (s == 'P') { host.SelectColorBox(2); ws.ProtectPaint = false; }
+            else if (s == 'L') { engine.MouseDown(kLeftButton, 250, 100); engine.MouseUp(kLeftButton, 260, 104); }
+            else if (s >= 'a') engine.EraseAt(13 + 40 * (s - 'a'), 13);
+            else Dab(static_cast<float>(13 + 40 * (s - 'A')), 13);
+        }
+    }
+    // The stroke value all pixels of block b hold (99 when they differ); a
+    // block shows paint exactly while its value is positive.
+    int Block(int b) {
+        const int x0 = 10 + 40 * b, v = ws.Stroke(x0, 10);
+        for (int y = 10; y < 17; ++y)
+            for (int x = x0; x < x0 + 7; ++x)
+                if (ws.Stroke(x, y) != v || (ws.Picture1.pixel(x, y) != ws.Picture2.pixel(x, y)) != (v > 0)) return 99;
+        return v;
+    }
+};
+
+TEST_F(Undo, ScriptsWalkTheChain) {
+    const struct { const char* script; std::array<int, 5> blocks; int level; bool undo, redo; } cases[] = {
+        {"uc", {0, 0, 0, 0, 0}, 0, false, false},  // nothing to undo or clear
+        {"ABCuu", {1, -2, -3, 0, 0}, 1, true, true},
+        {"ABCuur", {1, 2, -3, 0, 0}, 2, true, true},  // -3 is still waiting
+        {"ABCuurr", {1, 2, 3, 0, 0}, 3, true, false},
+        {"ABCc", {-1, -2, -3, 0, 0}, 0, false, true},
+        {"ABCcr", {1, -2, -3, 0, 0}, 1, true, true},
+        {"ABCcrrr", {1, 2, 3, 0, 0}, 3, true, false},
+        {"ABuC", {1, -2, 2, 0, 0}, 2, true, false},  // a new stroke disables Redo
+        {"ABuL", {1, -2, 0, 0, 0}, 2, true, true},   // a chalk line does not
+        {"ABuCu", {1, -2, -2, 0, 0}, 1, true, true},
+        {"ABuCur", {1, 2, 2, 0, 0}, 2, true, false},
+        {"ABCuuDEu", {1, 0, -3, 2, -3}, 2, true, true},  // leftovers between 0 and the level go
+        {"APAu", {-2, 0, 0, 0, 0}, 1, true, true},       // the older paint under it does not return
+        {"ABb", {1, -3, 0, 0, 0}, 2, true, true},        // erased paint waits as the next redo
+        {"ABbr", {1, 3, 0, 0, 0}, 3, true, false},
+        {"AaBu", {-2, -2, 0, 0, 0}, 1, true, true},      // or joins the next stroke undone
+        {"AaBur", {2, 2, 0, 0, 0}, 2, true, false}};
+    for (const auto& c : cases) {
+        ws.ClearMask();
+        ws.StrokeNumber = 0;
+        ws.Picture1 = ws.Picture2;
+        Run(c.script);
+        std::array<int, 5> blocks{};
+        for (int b = 0; b < 5; ++b) blocks[static_cast<size_t>(b)] = Block(b);
+        EXPECT_EQ(std::tuple(blocks, ws.StrokeNumber, ws.UndoEnabled, ws.RedoEnabled),
+                  std::tuple(c.blocks, c.level, c.undo, c.redo)) << c.script;
+    }
+}
+
+} // namespace
