@@ -30,8 +30,8 @@ int BoundaryBox(const int16_t* color, int at) {
 
 void PaintEngine::RenderEdges(int mode) {
     if (mode == 0) mode = ws_.BlendEdges ? 2 : 1;
-    const int lastX = static_cast<int>(std::lrint(ws_.MaxX - 1.0));
-    const int lastY = static_cast<int>(std::lrint(ws_.MaxY - 1.0));
+    const int lastX = innerMaxX();
+    const int lastY = innerMaxY();
     const int16_t* stroke = ws_.PaintMask.data();
     const int16_t* color = stroke + Workspace::kMaskPlane;
     int loaded = -1;  // box last loaded by a plain redraw; loading it again changes nothing

@@ -11,8 +11,8 @@ void PaintEngine::ExpandEdges() {
     if (n < 1) return;  // no stroke to grow, and 0 would match every unpainted pixel
 
     // One pixel wider, but never the outermost rows and columns.
-    const int lastX = static_cast<int>(std::lrint(ws_.MaxX - 1.0));
-    const int lastY = static_cast<int>(std::lrint(ws_.MaxY - 1.0));
+    const int lastX = innerMaxX();
+    const int lastY = innerMaxY();
     ws_.StrokeLeft = static_cast<int16_t>(std::max(ws_.StrokeLeft - 1, 1));
     ws_.StrokeRight = static_cast<int16_t>(std::min(ws_.StrokeRight + 1, lastX));
     ws_.StrokeTop = static_cast<int16_t>(std::max(ws_.StrokeTop - 1, 1));

@@ -51,9 +51,9 @@ void PaintEngine::MouseDown(int button, float X, float Y) {
     // The reference is sampled on a cross of five pixels, so its centre
     // stays one pixel inside the picture.
     int rx = std::max(x, 1);
-    if (rx == maxX()) rx = static_cast<int>(std::lrint(ws_.MaxX - 1.0));
+    if (rx == maxX()) rx = innerMaxX();
     int ry = std::max(y, 1);
-    if (ry == maxY()) ry = static_cast<int>(std::lrint(ws_.MaxY - 1.0));
+    if (ry == maxY()) ry = innerMaxY();
     if (BoxReference(ws_.CurrentColor) == 0 || ws_.SetReferenceMode) {
         if (!ReferenceStep(rx, ry)) return;
     }

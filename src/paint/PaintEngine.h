@@ -1,5 +1,6 @@
 #pragma once
 #include <array>
+#include <cmath>
 #include <cstdint>
 #include <string>
 #include <vector>
@@ -56,8 +57,6 @@ public:
     void RollerAt(int x, int y);
     // Tries to paint one pixel with CurrentColor; true when it was painted.
     bool PaintPixel(int x, int y);
-    // Pulls MatchColor toward the planes of (x, y) by MatchWeight.
-    void UpdateMatchColor(int x, int y);
 
     // --- Rendering ---
     // Draws (x, y) of Picture1 from the drawing colour and the photo's luma.
@@ -66,8 +65,6 @@ public:
     void RepaintColor(int i);
     // Edge pass: 0 = as the Blend Edges option says, 1 = plain, 2 = blend.
     void RenderEdges(int mode);
-    void BlendOutsidePixel(int x, int y, int i);
-    void BlendBoundaryPixel(int& a, int& b);
     void RefreshAll();  // the refresh command: photo, every box, edge pass
 
     // --- Undo and redo ---
@@ -81,6 +78,13 @@ public:
     void DrawChalkLine(bool erase, bool commit);
 
 private:
+    // Pulls MatchColor toward the planes of (x, y) by MatchWeight.
+    void UpdateMatchColor(int x, int y);
+    // Drawing colours of the blend pass: an unpainted pixel toward box i, and
+    // the boundary between boxes |a| and |b| (both made positive).
+    void BlendOutsidePixel(int x, int y, int i);
+    void BlendBoundaryPixel(int& a, int& b);
+
     // Press steps that hand over to the other tools.
     bool ReferenceStep(int x, int y);   // false: the press ends here
     void PickupClick(int x, int y);
@@ -94,6 +98,9 @@ private:
     bool Inside(int x, int y) const { return x >= 0 && y >= 0 && x <= maxX() && y <= maxY(); }
     int maxX() const { return ws_.WholeMaxX(); }
     int maxY() const { return ws_.WholeMaxY(); }
+    // The last column and row inside the picture's one-pixel border.
+    int innerMaxX() const { return static_cast<int>(std::lrint(ws_.MaxX - 1.0)); }
+    int innerMaxY() const { return static_cast<int>(std::lrint(ws_.MaxY - 1.0)); }
     // Colours of box i; a box index outside 1..12 (a damaged mask) reads as empty.
     int32_t BoxColor(int i) const;
     int32_t BoxReference(int i) const;
