@@ -1,5 +1,6 @@
 // Speed of the painting engine on a 400 x 300 photo with painted bands: one
-// roller application, the blend pass and the refresh command.
+// roller application, the edge passes, a box repaint, undo, redo and the
+// refresh command.
 #include <benchmark/benchmark.h>
 
 #include "paint/PhotoArt.h"
@@ -45,11 +46,30 @@ void BM_Roller(benchmark::State& state) {
     ws.PaintMask = mask;
 }
 
-void BM_RenderEdgesBlend(benchmark::State& state) { for (auto _ : state) Scene().engine.RenderEdges(2); }
+// Mode 2 blends, mode 1 draws plain.
+void BM_RenderEdges(benchmark::State& state) {
+    for (auto _ : state) Scene().engine.RenderEdges(static_cast<int>(state.range(0)));
+}
+void BM_RepaintColor(benchmark::State& state) { for (auto _ : state) Scene().engine.RepaintColor(2); }
 void BM_RefreshAll(benchmark::State& state) { for (auto _ : state) Scene().engine.RefreshAll(); }
+
+// Undo of the last band (its redo untimed), and the redo (its undo untimed).
+void BM_UndoRedo(benchmark::State& state) {
+    PaintEngine& engine = Scene().engine;
+    const bool timeUndo = state.range(0) != 0;
+    for (auto _ : state) {
+        if (!timeUndo) state.PauseTiming();
+        engine.UndoStroke();
+        if (!timeUndo) state.ResumeTiming(); else state.PauseTiming();
+        engine.RedoStroke();
+        if (timeUndo) state.ResumeTiming();
+    }
+}
 
 } // namespace
 
 BENCHMARK(BM_Roller)->Arg(1)->Arg(0)->Unit(benchmark::kMicrosecond);
-BENCHMARK(BM_RenderEdgesBlend)->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_RenderEdges)->Arg(2)->Arg(1)->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_RepaintColor)->Unit(benchmark::kMillisecond);
+BENCHMARK(BM_UndoRedo)->Arg(1)->Arg(0)->Unit(benchmark::kMillisecond);
 BENCHMARK(BM_RefreshAll)->Unit(benchmark::kMillisecond);

@@ -1,4 +1,5 @@
-// Opening a large camera photo: decoding at reduced scale, fitting and analysing.
+// Opening a large camera photo: decoding at reduced scale, fitting and
+// analysing, beside decoding the same photo at full size.
 #include <benchmark/benchmark.h>
 
 #include <QCoreApplication>
@@ -30,3 +31,11 @@ static void BM_OpenLargeJpeg(benchmark::State& state) {
     }
 }
 BENCHMARK(BM_OpenLargeJpeg)->Unit(benchmark::kMillisecond);
+
+// Decoding alone: at the reduced scale the open uses (1), and at full size (0),
+// as a plain reader would.
+static void BM_DecodeLargeJpeg(benchmark::State& state) {
+    const QSize reduceFor = state.range(0) ? QSize(400, 300) : QSize();
+    for (auto _ : state) benchmark::DoNotOptimize(imaging::DecodePictureFile(LargeJpeg(), reduceFor));
+}
+BENCHMARK(BM_DecodeLargeJpeg)->Arg(1)->Arg(0)->Unit(benchmark::kMillisecond);

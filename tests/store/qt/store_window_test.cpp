@@ -100,6 +100,8 @@ private slots:
     void badFilesGetTheLoadError_data();
     void badFilesGetTheLoadError();
     void saveAndReopenWork();
+    void brokenMaskOpensClearWithAWarning();
+    void missingPicsFolderIsMade();
     void overwriteRefusedOrFailedKeepsTheOldFiles();
     void unsafeNamesAreRefused_data();
     void unsafeNamesAreRefused();
@@ -186,6 +188,28 @@ void StoreWindowTest::saveAndReopenWork() {
         QCOMPARE(f.ws().Boxes[5].name, std::string(withScheme ? "Garage Door" : "Other"));
         QCOMPARE(f.ws().Boxes[5].reference, withScheme ? 0x808080 : 0);
     }
+}
+
+void StoreWindowTest::brokenMaskOpensClearWithAWarning() {
+    FormFixture f;
+    PaintedHouse(f);
+    f.ws().ColorPlane(30, 30) = 13;  // no such colour box
+    f.ws().Stroke(30, 30) = 1;
+    SaveAs(f, "porch");
+    QVERIFY(Click(f, "porch.bmp") && Loaded(f));
+    QCOMPARE(f.platform().messages.size(), 1);
+    QCOMPARE(f.platform().messages[0].title, QString("Warning - Paint Mask"));
+    QVERIFY(std::all_of(f.ws().PaintMask.begin(), f.ws().PaintMask.end(), [](int16_t v) { return v == 0; }));
+    QVERIFY(!f.ws().UndoEnabled && !f.ws().RedoEnabled);
+}
+
+void StoreWindowTest::missingPicsFolderIsMade() {
+    FormFixture f(false);
+    QVERIFY(QDir(f.picsFolder()).removeRecursively());
+    f.startup();
+    QVERIFY(QFileInfo(f.picsFolder()).isDir());
+    QCOMPARE(f.form().Dir1->path(), f.picsFolder());
+    QVERIFY(f.platform().messages.isEmpty());
 }
 
 void StoreWindowTest::overwriteRefusedOrFailedKeepsTheOldFiles() {
