@@ -28,8 +28,10 @@ bool IsPlainName(const QString& name) {
 
 void TintrollaForm::SaveWork() {
     Workspace& ws = workspace();
-    // Only a whole work is saved: not a preview, not a load half done.
-    if (!ws.PictureLoaded || ws.LoadingPicture) return;
+    // Only a whole work is saved: not a preview, not a load half done. After
+    // "About" the work is still held, under the title screen.
+    const bool behindTitle = !ws.PictureLoaded && ws.PictureModified;
+    if ((!ws.PictureLoaded && !behindTitle) || ws.LoadingPicture) return;
 
     SaveForm form(this);
     form.SaveFilename->setText(store::FileNameOf(store::StripExtension(CurrentPicturePath)));
@@ -56,6 +58,13 @@ void TintrollaForm::SaveWork() {
     }
 
     commitRename();  // a box name being typed belongs to the saved scheme
+    if (behindTitle) {
+        // The title screen covers the view: draw the work again from the
+        // photo and the mask, save it, and leave the title screen to the poll.
+        ws.PictureLoaded = true;
+        engine().RefreshAll();
+        ws.PictureLoaded = false;
+    }
     RefreshPicture();
     QString error;
     if (!writeWorkFiles(base, error)) {

@@ -101,6 +101,7 @@ private slots:
     void badFilesGetTheLoadError();
     void saveAndReopenWork();
     void brokenMaskOpensClearWithAWarning();
+    void workBehindTheTitleScreenIsSaved();
     void missingPicsFolderIsMade();
     void overwriteRefusedOrFailedKeepsTheOldFiles();
     void unsafeNamesAreRefused_data();
@@ -201,6 +202,27 @@ void StoreWindowTest::brokenMaskOpensClearWithAWarning() {
     QCOMPARE(f.platform().messages[0].title, QString("Warning - Paint Mask"));
     QVERIFY(std::all_of(f.ws().PaintMask.begin(), f.ws().PaintMask.end(), [](int16_t v) { return v == 0; }));
     QVERIFY(!f.ws().UndoEnabled && !f.ws().RedoEnabled);
+}
+
+void StoreWindowTest::workBehindTheTitleScreenIsSaved() {
+    FormFixture f;
+    PaintedHouse(f);
+    f.form().AboutMenuItem_Click();
+    f.form().BackgroundTimer_Timer();  // the title screen covers the view
+    QVERIFY(!Shows(f.ws().Picture1, kHouse));
+    f.platform().answers.push_back(platform::Answer::Yes);
+    f.platform().dialogs.push_back([](QDialog& d) {
+        auto& form = dynamic_cast<SaveForm&>(d);
+        form.SaveFilename->setText("front work");
+        form.SaveButton_Click();
+        return int(QDialog::Accepted);
+    });
+    QVERIFY(f.form().close());
+    QVERIFY(!f.ws().PictureModified);
+    const imaging::DecodedPicture saved = imaging::DecodePictureFile(f.picsFolder() + "/front work.bmp");
+    QVERIFY(saved.ok());
+    QCOMPARE(saved.image.pixel(150, 50), ArtColor('R'));
+    QCOMPARE(saved.image.pixel(350, 150), ArtColor('W'));
 }
 
 void StoreWindowTest::missingPicsFolderIsMade() {
