@@ -60,6 +60,8 @@ public:
     void Form_Click();
     bool Form_QueryUnload();   // true = cancel the close
     void ExitMenuItem_Click();
+    // Ends the pickup and set-reference tools and shows the current tool.
+    void endPickupAndSetReference();
     // Shows a message through the platform layer.
     platform::Answer Ask(const QString& title, const QString& text, platform::Buttons buttons,
                          platform::Icon icon = platform::Icon::None);

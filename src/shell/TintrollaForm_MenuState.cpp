@@ -80,9 +80,6 @@ void TintrollaForm::RollerNarrowMenuItem_Click() {
 
 // Chalk line ends the modal tools; the roller size under it stays.
 void TintrollaForm::ChalkLineMenuItem_Click() {
-    Workspace& ws = workspace();
-    EndModalTools(ws);
-    ws.ChalkLineMode = true;
-    UpdatePictureCursor();
-    ToolStateChanged();
+    workspace().ChalkLineMode = true;
+    endPickupAndSetReference();
 }

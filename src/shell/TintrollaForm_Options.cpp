@@ -1,6 +1,5 @@
 #include <QCheckBox>
 
-#include "paint/Tools.h"
 #include "shell/TintrollaForm.h"
 
 // The check boxes hold the options; their values reach the workspace through
@@ -12,20 +11,14 @@ void TintrollaForm::AutoCropCheckbox_Click() {
 }
 
 void TintrollaForm::BlendEdgesCheckbox_Click() {
-    UpdatePictureCursor();
-    EndModalTools(workspace());
-    ToolStateChanged();
+    endPickupAndSetReference();
     engine().RenderEdges(0);  // blend or restore by the check box
 }
 
 void TintrollaForm::ExpandEdgesCheckbox_Click() {
-    UpdatePictureCursor();
-    EndModalTools(workspace());
-    ToolStateChanged();
+    endPickupAndSetReference();
 }
 
 void TintrollaForm::ProtectPaintCheckbox_Click() {
-    UpdatePictureCursor();
-    EndModalTools(workspace());
-    ToolStateChanged();
+    endPickupAndSetReference();
 }

@@ -58,10 +58,10 @@ void TintrollaForm::BackgroundTimer_Timer() {
         DrawTitleScreen();
 }
 
-void TintrollaForm::Form_Click() {
-    Workspace& ws = workspace();
-    ws.PickupLabelVisible = false;
-    ws.SetReferenceMode = false;
+void TintrollaForm::Form_Click() { endPickupAndSetReference(); }
+
+void TintrollaForm::endPickupAndSetReference() {
+    EndModalTools(workspace());
     UpdatePictureCursor();
     ToolStateChanged();
 }

@@ -104,9 +104,7 @@ void TintrollaForm::NewColourMenuItem_Click() {
         engine().RepaintColor(i);
     }
     // Taken or cancelled, the pickup and set-reference tools end.
-    EndModalTools(ws);
-    UpdatePictureCursor();
-    ToolStateChanged();
+    endPickupAndSetReference();
 }
 
 void TintrollaForm::ClearAllColorsMenuItem_Click() {

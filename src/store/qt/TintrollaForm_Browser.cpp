@@ -56,20 +56,12 @@ void TintrollaForm::Dir1_Change() {
     File1->setEnabled(true);
     File1->setPath(Dir1->path());
     ExportFolder = Dir1->path();
-    Workspace& ws = workspace();
-    ws.PickupLabelVisible = false;
-    ws.SetReferenceMode = false;
-    UpdatePictureCursor();
-    ToolStateChanged();
+    endPickupAndSetReference();
 }
 
 void TintrollaForm::Drive1_Change() {
     Dir1->setPath(Drive1->drive());  // a drive that cannot be opened changes nothing
-    Workspace& ws = workspace();
-    ws.PickupLabelVisible = false;
-    ws.SetReferenceMode = false;
-    UpdatePictureCursor();
-    ToolStateChanged();
+    endPickupAndSetReference();
 }
 
 void TintrollaForm::rereadFileList() { File1->setPath(Dir1->path()); }
