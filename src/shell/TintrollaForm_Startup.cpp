@@ -72,7 +72,11 @@ bool TintrollaForm::Form_QueryUnload() {
                                         QStringLiteral("Do you want to save your work now?"),
                                         platform::Buttons::YesNoCancel);
     if (answer == platform::Answer::Cancel) return true;
-    if (answer == platform::Answer::Yes) SaveWork();  // closes whatever the save did
+    if (answer == platform::Answer::Yes) {
+        SaveWork();
+        // A save that failed or was called off would lose the work: stay open.
+        return workspace().PictureModified;
+    }
     return false;
 }
 
