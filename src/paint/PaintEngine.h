@@ -95,6 +95,7 @@ private:
     // False (after telling the user) when one more stroke number would not
     // fit the 16-bit stroke plane.
     bool RoomForAnotherStroke();
+    void EndHistoryStep();
     bool Inside(int x, int y) const { return x >= 0 && y >= 0 && x <= maxX() && y <= maxY(); }
     int maxX() const { return ws_.WholeMaxX(); }
     int maxY() const { return ws_.WholeMaxY(); }

@@ -12,6 +12,14 @@ bool PaintEngine::RoomForAnotherStroke() {
     return false;
 }
 
+// After an undo or redo the modal tools end and the picture counts as changed.
+void PaintEngine::EndHistoryStep() {
+    EndModalTools(ws_);
+    UpdatePictureCursor(ws_);
+    ws_.PictureModified = true;
+    host_.ToolStateChanged();
+}
+
 void PaintEngine::UndoStroke() {
     if (ws_.StrokeNumber == 0) return;
     if (ws_.BlendEdges) RenderEdges(1);
@@ -36,10 +44,7 @@ void PaintEngine::UndoStroke() {
     ws_.StrokeNumber = n - 1;
     if (ws_.StrokeNumber == 0) ws_.UndoEnabled = false;
     ws_.RedoEnabled = true;
-    EndModalTools(ws_);
-    UpdatePictureCursor(ws_);
-    ws_.PictureModified = true;
-    host_.ToolStateChanged();
+    EndHistoryStep();
 }
 
 void PaintEngine::RedoStroke() {
@@ -82,10 +87,7 @@ void PaintEngine::RedoStroke() {
 
     ws_.UndoEnabled = true;
     ws_.RedoEnabled = more;
-    EndModalTools(ws_);
-    UpdatePictureCursor(ws_);
-    ws_.PictureModified = true;
-    host_.ToolStateChanged();
+    EndHistoryStep();
 }
 
 void PaintEngine::ClearAll() {
