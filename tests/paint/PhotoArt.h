@@ -16,11 +16,9 @@ using Art = std::vector<std::string>;
 
 // Photo colours: none grey, none symmetric in red and blue.
 inline int32_t Swatch(char c) {
-    switch (c) {
-    case 'R': return HSLcolor::JoinColor(200, 40, 30);   // brick
-    case 'B': return HSLcolor::JoinColor(30, 60, 190);   // blue door
-    default: return HSLcolor::JoinColor(220, 200, 40);   // sunlit wall
-    }
+    return c == 'R' ? HSLcolor::JoinColor(200, 40, 30)     // brick
+           : c == 'B' ? HSLcolor::JoinColor(30, 60, 190)   // blue door
+                      : HSLcolor::JoinColor(220, 200, 40);  // sunlit wall
 }
 
 // One photo pixel everywhere the engine reads it: the pictures, the six
@@ -78,14 +76,12 @@ struct FakeHost : PaintHost {
     void Warning(const std::string& title, const std::string& text) override { warnings.push_back(title + "|" + text); }
     void PumpEvents() override { ++pumps; }
     void SelectColorBox(int index) override {
-        selected.push_back(index);
         ws.CurrentColor = static_cast<int16_t>(index);
         LoadDrawColor(ws, index);
     }
     Workspace& ws;
     int refreshes = 0, pumps = 0;
     std::vector<std::string> warnings;  // "title|text"
-    std::vector<int> selected;
 };
 
 } // namespace painttest
