@@ -16,10 +16,7 @@ protected:
         LoadDrawColor(ws, 1);
     }
     // A press and release without moving.
-    void Dab(float x, float y) {
-        engine.MouseDown(kLeftButton, x, y);
-        engine.MouseUp(kLeftButton, x, y);
-    }
+    void Dab(float x, float y) { engine.MouseDown(kLeftButton, x, y); engine.MouseUp(kLeftButton, x, y); }
     Workspace ws;
     FakeHost host{ws};
     PaintEngine engine{ws, host};

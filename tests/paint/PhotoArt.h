@@ -15,10 +15,9 @@ namespace painttest {
 using Art = std::vector<std::string>;
 
 // Photo colours: none grey, none symmetric in red and blue.
+// 'R' brick, 'B' blue door, anything else sunlit wall.
 inline int32_t Swatch(char c) {
-    return c == 'R' ? HSLcolor::JoinColor(200, 40, 30)     // brick
-           : c == 'B' ? HSLcolor::JoinColor(30, 60, 190)   // blue door
-                      : HSLcolor::JoinColor(220, 200, 40);  // sunlit wall
+    return c == 'R' ? HSLcolor::JoinColor(200, 40, 30) : c == 'B' ? HSLcolor::JoinColor(30, 60, 190) : HSLcolor::JoinColor(220, 200, 40);
 }
 
 // One photo pixel everywhere the engine reads it: the pictures, the six
@@ -75,10 +74,7 @@ struct FakeHost : PaintHost {
     void ToolStateChanged() override {}
     void Warning(const std::string& title, const std::string& text) override { warnings.push_back(title + "|" + text); }
     void PumpEvents() override { ++pumps; }
-    void SelectColorBox(int index) override {
-        ws.CurrentColor = static_cast<int16_t>(index);
-        LoadDrawColor(ws, index);
-    }
+    void SelectColorBox(int index) override { ws.CurrentColor = static_cast<int16_t>(index); LoadDrawColor(ws, index); }
     Workspace& ws;
     int refreshes = 0, pumps = 0;
     std::vector<std::string> warnings;  // "title|text"

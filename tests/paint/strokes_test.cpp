@@ -13,11 +13,11 @@ namespace {
 // the arrays.
 TEST_F(PaintTest, PressesThatStartNothingAndPositionsOutsideThePicture) {
     const int32_t paint = std::exchange(ws.Boxes[1].color, kButtonFace);
-    for (const bool chalk : {false, true}) {
-        ws.ChalkLineMode = chalk;
-        engine.MouseDown(kLeftButton, 50, 50);
-        engine.MouseUp(kLeftButton, 80, 60);
-    }
+    ws.ChalkLineMode = true;
+    engine.MouseDown(kLeftButton, 50, 50);
+    engine.MouseUp(kLeftButton, 80, 60);
+    ws.ChalkLineMode = false;
+    Dab(50, 50);
     EXPECT_EQ(host.warnings, Art(2, "Warning - Painting Picture|No Paint color has been set yet."));
     EXPECT_EQ(std::pair(CountStroke(ws, 0), ws.UndoEnabled), std::pair(401 * 301, false));
     ws.Boxes[1].color = paint;
@@ -51,44 +51,34 @@ TEST_F(PaintTest, ColourTestWindows) {
     }
 }
 
-// One press fills the roller's square, clipped, refreshing once. A blue pixel
-// alone in the wall is painted alone: ring 1 finds nothing close to blue.
-// Positions go to the nearest pixel, ties to even.
+// A press lands on the nearest pixel, ties to even: a blue pixel alone in the
+// wall is painted alone, as ring 1 finds nothing close to blue. On the wall the
+// narrow roller's square is clipped at the corner. Each press refreshes once.
 TEST_F(PaintTest, OnePressFillsTheRollerSquareOfMatchingPixels) {
     SetPhotoPixel(ws, 100, 200, Swatch('B'));
-    const struct { bool wide; float x, y; int left, top, right, bottom; } cases[] = {
-        {false, 200, 150, 195, 145, 205, 155},     {true, 2, 3, 0, 0, 22, 23},
-        {false, 399, 299, 394, 294, 399, 299},     {false, 100.5f, 200, 100, 200, 100, 200},
-        {false, 99.5f, 199.5f, 100, 200, 100, 200}, {true, 100.49f, 200.5f, 100, 200, 100, 200}};
-    for (const auto& c : cases) {
+    for (auto [x, y] : {std::pair{100.5f, 200.0f}, {99.5f, 199.5f}, {100.49f, 200.5f}}) {
         ws.ClearMask();
-        ws.WideRoller = c.wide;
-        engine.MouseDown(kLeftButton, c.x, c.y);
-        EXPECT_EQ(CountStroke(ws, ws.StrokeNumber), (c.right - c.left + 1) * (c.bottom - c.top + 1));
-        EXPECT_EQ(ws.Stroke(c.left, c.top) + ws.Stroke(c.right, c.bottom), 2 * ws.StrokeNumber) << c.x;
+        engine.MouseDown(kLeftButton, x, y);
+        EXPECT_EQ(MaskArt(ws, 1, 99, 199, 3, 3), (Art{"...", ".1.", "..."})) << x << "," << y;
     }
-    EXPECT_EQ(host.refreshes, 6);
+    ws.WideRoller = false;
+    engine.MouseDown(kLeftButton, 399, 299);
+    EXPECT_EQ(std::pair(CountStroke(ws, ws.StrokeNumber), host.refreshes), std::pair(6 * 6, 4));
 }
 
 // Box 2 paint at x 190..194 and a chalk line of box 1 down column 205. A press
-// on box 2 still starts a stroke; with protection it keeps its box and nothing
-// spreads from it, and a press at x = 200 stops at the chalk.
-class Protect : public PaintTest, public ::testing::WithParamInterface<bool> {};
-
-TEST_P(Protect, DecidesWhatTheRollerMayRepaint) {
-    ws.ProtectPaint = GetParam();
+// on protected box 2 paint still starts a stroke, but it keeps its box and
+// nothing spreads from it; a press at x = 200 stops at the chalk.
+TEST_F(PaintTest, ProtectedPaintKeepsItsBoxAndChalkStopsTheRoller) {
     DrawMask(ws, Art(21, "11111"), 2, 190, 140);
     DrawMask(ws, Art(300, "#"), 1, 205, 0);
     ws.StrokeNumber = 1;
     ws.RedoEnabled = true;
     Dab(192, 150);
-    EXPECT_EQ(std::tuple(ws.StrokeNumber, ws.RedoEnabled, CountStroke(ws, 2)),
-              std::tuple(2, false, GetParam() ? 0 : 41 * 41));
+    EXPECT_EQ(std::tuple(ws.StrokeNumber, ws.RedoEnabled, CountStroke(ws, 2)), std::tuple(2, false, 0));
     Dab(200, 150);
-    EXPECT_EQ(MaskArt(ws, 1, 188, 150, 20, 1), (Art{GetParam() ? "11222221111111111a.." : "11111111111111111111"}));
+    EXPECT_EQ(MaskArt(ws, 1, 188, 150, 20, 1), (Art{"11222221111111111a.."}));
 }
-
-INSTANTIATE_TEST_SUITE_P(Options, Protect, ::testing::Bool());
 
 // At the largest number the 16-bit stroke plane holds, a roller press, a chalk
 // line, the eraser and a redo each refuse with a message and write nothing.
@@ -114,20 +104,13 @@ TEST_F(PaintTest, StrokeNumberNeverWraps) {
 // at its centre clears exactly that block.
 class Undo : public PaintTest {
 protected:
-    Undo() {
-        for (int b = 0; b < 5; ++b) DrawPhoto(ws, Art(7, std::string(7, "BRBRB"[b])), 10 + 40 * b, 10);
-        ws.Boxes[2] = {"", HSLcolor::JoinColor(200, 30, 90), HSLcolor::JoinColor(200, 180, 40)};
-    }
-    // A..E paint a block and a..e erase it, u undoes, r redoes, c clears all,
-    // L draws a chalk line, P turns protection off and goes on with box 2.
+    Undo() { for (int b = 0; b < 5; ++b) DrawPhoto(ws, Art(7, std::string(7, "BRBRB"[b])), 10 + 40 * b, 10); }
+    // A..E paint a block and a..e erase it, u undoes, r redoes, c clears all.
     void Run(const std::string& script) {
         for (const char s : script) {
-            ws.ChalkLineMode = s == 'L';
             if (s == 'u') engine.UndoStroke();
             else if (s == 'r') engine.RedoStroke();
             else if (s == 'c') engine.ClearAll();
-            else if (s == 'P') { host.SelectColorBox(2); ws.ProtectPaint = false; }
-            else if (s == 'L') { engine.MouseDown(kLeftButton, 250, 100); engine.MouseUp(kLeftButton, 260, 104); }
             else if (s >= 'a') engine.EraseAt(13 + 40 * (s - 'a'), 13);
             else Dab(static_cast<float>(13 + 40 * (s - 'A')), 13);
         }
@@ -145,11 +128,9 @@ TEST_F(Undo, ScriptsWalkTheChain) {
         {"uc", {0, 0, 0, 0, 0}, 0, false, false},  // nothing to undo or clear
         {"ABCuu", {1, -2, -3, 0, 0}, 1, true, true},  {"ABCuur", {1, 2, -3, 0, 0}, 2, true, true},
         {"ABCc", {-1, -2, -3, 0, 0}, 0, false, true}, {"ABCcrrr", {1, 2, 3, 0, 0}, 3, true, false},
-        {"ABuC", {1, -2, 2, 0, 0}, 2, true, false},  // a new stroke disables Redo
-        {"ABuL", {1, -2, 0, 0, 0}, 2, true, true},   // a chalk line does not
-        {"ABuCur", {1, 2, 2, 0, 0}, 2, true, false},
+        // a new stroke disables Redo; its redo brings back what shares its number
+        {"ABuC", {1, -2, 2, 0, 0}, 2, true, false}, {"ABuCur", {1, 2, 2, 0, 0}, 2, true, false},
         {"ABCuuDEu", {1, 0, -3, 2, -3}, 2, true, true},  // leftovers between 0 and the level go
-        {"APAu", {-2, 0, 0, 0, 0}, 1, true, true},       // the older paint under it does not return
         // erased paint waits as the next redo, or joins the next stroke undone
         {"ABb", {1, -3, 0, 0, 0}, 2, true, true},  {"ABbr", {1, 3, 0, 0, 0}, 3, true, false},
         {"AaBu", {-2, -2, 0, 0, 0}, 1, true, true}, {"AaBur", {2, 2, 0, 0, 0}, 2, true, false}};
