@@ -78,6 +78,11 @@ TEST_F(PaintTest, ProtectedPaintKeepsItsBoxAndChalkStopsTheRoller) {
     EXPECT_EQ(std::tuple(ws.StrokeNumber, ws.RedoEnabled, CountStroke(ws, 2)), std::tuple(2, false, 0));
     Dab(200, 150);
     EXPECT_EQ(MaskArt(ws, 1, 188, 150, 20, 1), (Art{"11222221111111111a.."}));
+    // Without protection the roller takes over box 2 paint and the chalk, and
+    // so crosses where the line was.
+    ws.ProtectPaint = false;
+    Dab(192, 150);
+    EXPECT_EQ(MaskArt(ws, 1, 188, 150, 20, 1), (Art{"11111111111111111111"}));
 }
 
 // At the largest number the 16-bit stroke plane holds, a roller press, a chalk
