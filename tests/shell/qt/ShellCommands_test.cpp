@@ -40,7 +40,10 @@ const struct Row { const char *name, *before; bool coloured; const char *key, *d
     {"undo ends set-reference", "SetRefPoint", true, "Undo", "NormalRoller WideRoller", C::WideRoller, ""},
 };
 
-QImage Argb(const QImage& image) { return image.convertToFormat(QImage::Format_ARGB32); }
+// A cursor's pixmap keeps its pixels premultiplied; turning them back into
+// straight alpha rounds differently with each SIMD path Qt picks at run time,
+// so both sides are compared premultiplied, where the conversion is exact.
+QImage Argb(const QImage& image) { return image.convertToFormat(QImage::Format_ARGB32_Premultiplied); }
 QString Q(std::string_view text) { return QString::fromUtf8(text.data(), qsizetype(text.size())); }
 
 // Lists a menu bar or menu as "Caption|Shortcut" rows, "-" for separators, with
