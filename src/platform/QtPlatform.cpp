@@ -88,11 +88,15 @@ std::optional<int32_t> QtPlatform::chooseColor(QWidget* parent, int32_t start) {
     return c.red() + 256 * c.green() + 65536 * c.blue();
 }
 
-bool QtPlatform::choosePrinter(QWidget* parent, QPrinter& printer, int /*flags*/) {
+bool QtPlatform::choosePrinter(QWidget* parent, QPrinter& printer, int flags) {
     QPrintDialog dialog(&printer, parent);
-    dialog.setOption(QAbstractPrintDialog::PrintSelection, false);
-    dialog.setOption(QAbstractPrintDialog::PrintPageRange, false);
-    dialog.setOption(QAbstractPrintDialog::PrintToFile, false);
+    // &H4 hides the selection, &H8 the page numbers. The hide-print-to-file
+    // flag (&H100000) is about a raw printer file, which Qt's dialog does not
+    // offer; its "Print to File (PDF)" stays, as many desktops have no printer.
+    dialog.setOption(QAbstractPrintDialog::PrintSelection, (flags & 0x4) == 0);
+    dialog.setOption(QAbstractPrintDialog::PrintPageRange, (flags & 0x8) == 0);
+    dialog.setOption(QAbstractPrintDialog::PrintCurrentPage, false);
+    dialog.setOption(QAbstractPrintDialog::PrintToFile, true);
     return dialog.exec() == QDialog::Accepted;
 }
 

@@ -36,8 +36,9 @@ std::optional<int32_t> ScriptedPlatform::chooseColor(QWidget*, int32_t start) {
     return TakeOr(colors, std::optional<int32_t>{});
 }
 
-bool ScriptedPlatform::choosePrinter(QWidget*, QPrinter& printer, int) {
+bool ScriptedPlatform::choosePrinter(QWidget*, QPrinter& printer, int flags) {
     ++printerRequests;
+    printerFlags.append(flags);
     if (preparePrinter) preparePrinter(printer);
     return TakeOr(printers, false);
 }

@@ -31,6 +31,7 @@ public:
     QList<int32_t> colorStarts;
     QList<QUrl> urls;
     int printerRequests = 0;
+    QList<int> printerFlags;
     int dialogCount = 0;
     int beeps = 0;
     int eventRounds = 0;

@@ -1,13 +1,16 @@
 #pragma once
+#include <QDate>
 #include <QHash>
 #include <QMainWindow>
 #include <QString>
 #include <array>
+#include <functional>
 #include <memory>
 
 #include "paint/PaintEngine.h"
 #include "paint/Workspace.h"
 #include "platform/Platform.h"
+#include "print/PaintChoiceSheet.h"
 
 class QAction;
 class QCheckBox;
@@ -30,6 +33,7 @@ class PictureView;
 //   paint/qt/TintrollaForm_Picture.cpp   the work picture's mouse handlers
 //   scheme/qt/TintrollaForm_Colors.cpp   colour boxes, renaming, scheme files
 //   store/qt/TintrollaForm_*.cpp         browser, opening, saving, deleting
+//   shell/TintrollaForm_Print.cpp   the paint-choice printout
 class TintrollaForm : public QMainWindow, public PaintHost {
     Q_OBJECT
 public:
@@ -155,6 +159,14 @@ public:
     bool isPreviousWork(const QString& path) const;
     // Writes the work's four files as one: all are staged before any replaces its old copy.
     bool writeWorkFiles(const QString& base, QString& error);
+
+    // --- Paint-choice printout (shell/TintrollaForm_Print.cpp) ---
+    void PrintMenuItem_Click();
+    // What the sheet prints now: the picture's name, today's date in the
+    // long date format and the colour boxes.
+    print::SheetContent paintChoiceContent() const;
+    // Today's date as the printout shows it; tests fix the day.
+    std::function<QDate()> Today = [] { return QDate::currentDate(); };
 
     // --- The work picture (paint/qt/TintrollaForm_Picture.cpp) ---
     void Picture1_MouseDown(int button, float x, float y);

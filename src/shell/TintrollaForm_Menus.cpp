@@ -68,11 +68,11 @@ void TintrollaForm::buildMenus() {
          &TintrollaForm::OpenFromFileMenuItem_Click);
     item(file, "SaveMenuItem", QStringLiteral("&Save"), key(Qt::CTRL | Qt::Key_S), &TintrollaForm::SaveWork);
     QMenu* exportMenu = subMenu(file, "ExportMenu", QStringLiteral("&Export"));
-    // Export and printing land later; their items are in place and enabled by the rules.
+    // Export lands later; its items are in place and enabled by the rules.
     item(exportMenu, "ToClipboardMenuItem", QStringLiteral("to &Clipboard"), key(Qt::CTRL | Qt::Key_C), [] {});
     item(exportMenu, "ExportToFileMenuItem", QStringLiteral("to &File"), key(Qt::CTRL | Qt::Key_E), [] {});
     file->addSeparator();
-    item(file, "PrintMenuItem", QStringLiteral("&Print"), key(Qt::CTRL | Qt::Key_P), [] {});
+    item(file, "PrintMenuItem", QStringLiteral("&Print"), key(Qt::CTRL | Qt::Key_P), &TintrollaForm::PrintMenuItem_Click);
     item(file, "DeleteMenuItem", QStringLiteral("&Delete"), key(Qt::Key_Delete), &TintrollaForm::DeletePicture);
     file->addSeparator();
     item(file, "ExitMenuItem", QStringLiteral("E&xit"), none, &TintrollaForm::ExitMenuItem_Click);

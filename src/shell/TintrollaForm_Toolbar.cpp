@@ -75,7 +75,7 @@ void TintrollaForm::Toolbar1_ButtonClick(const QString& key) {
         else if (key == QLatin1String("PicsIcon")) ShowPicsFolder();
         else if (key == QLatin1String("Desktop")) ShowDesktopFolder();
         else if (key == QLatin1String("Delete")) DeletePicture();
-        else if (key == QLatin1String("Print")) { /* the paint-choice sheet is not built yet */ }
+        else if (key == QLatin1String("Print")) PrintMenuItem_Click();
         else if (key == QLatin1String("Undo")) engine().UndoStroke();
         else if (key == QLatin1String("Redo")) engine().RedoStroke();
         else if (key == QLatin1String("NewColour")) NewColourMenuItem_Click();
