@@ -89,7 +89,7 @@ PaintChoiceSheet LayoutPaintChoiceSheet(const SheetContent& content, const Sheet
     sheet.date = at.print(content.date);
     at.endLine();
 
-    // The picture keeps the work picture's shape at two thirds of the paper's width.
+    // The picture keeps the work picture's shape, 0.66 of the paper's width wide.
     const double pw = 0.66 * page.width;
     const double ph = pw * content.maxY / content.maxX;
     sheet.shadow = {m + kShadowOffset, m + kShadowOffset, m + kShadowOffset + pw, m + kShadowOffset + ph};
