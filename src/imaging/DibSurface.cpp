@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <chrono>
 #include <cmath>
+#include <cstring>
 #include <limits>
 #include <new>
 #include <random>
@@ -43,7 +44,7 @@ bool DibSurface::Create(int32_t lWidth, int32_t lHeight) {
     return CreateDIB(lWidth, lHeight);
 }
 
-bool DibSurface::CreateDIB(int32_t lWidth, int32_t lHeight) {
+bool DibSurface::CreateDIB(int32_t lWidth, int32_t lHeight, bool zeroed) {
     const int64_t stride = (int64_t{lWidth} * 3 + 3) & ~int64_t{3};
     const int64_t image = stride * lHeight;
     if (!Fits32(int64_t{lWidth} * 3 + 3) || !Fits32(image))
@@ -53,17 +54,23 @@ bool DibSurface::CreateDIB(int32_t lWidth, int32_t lHeight) {
     height_ = lHeight;
     imageSize_ = static_cast<int32_t>(image);
     if (lWidth <= 0 || lHeight <= 0) return false;
-    try {
-        bits_.assign(static_cast<size_t>(image), 0);
-    } catch (const std::bad_alloc&) {
-        bits_.clear();
-        return false;
+    bits_.reset(new (std::nothrow) uint8_t[static_cast<size_t>(image)]);
+    if (!bits_) return false;
+    if (zeroed) {
+        std::memset(bits_.get(), 0, static_cast<size_t>(image));
+    } else {
+        const size_t pixels = 3 * static_cast<size_t>(lWidth);
+        for (int32_t r = 0; r < lHeight; ++r)
+            std::memset(bits_.get() + static_cast<size_t>(r) * static_cast<size_t>(stride) + pixels, 0,
+                        static_cast<size_t>(stride) - pixels);
     }
     return true;
 }
 
 void DibSurface::CreateFromPicture(const Picture& picThis) {
-    if (!Create(picThis.width(), picThis.height())) return;
+    ClearUp();
+    // Every pixel is written next, so only the padding needs clearing.
+    if (!CreateDIB(picThis.width(), picThis.height(), false)) return;
     LoadPictureBlt(picThis);
 }
 
@@ -74,8 +81,9 @@ void DibSurface::LoadPictureBlt(const Picture& src, int32_t lSrcLeft, int32_t lS
                          src.width(), src.height(), width_, height_);
     for (int64_t j = 0; j < b.h; ++j) {
         uint8_t* out = At(static_cast<int32_t>(b.dx), static_cast<int32_t>(b.dy + j));
+        const int32_t* in = src.data() + (b.sy + j) * src.width() + b.sx;
         for (int64_t i = 0; i < b.w; ++i, out += 3) {
-            const auto v = static_cast<uint32_t>(src.pixel(static_cast<int>(b.sx + i), static_cast<int>(b.sy + j)));
+            const auto v = static_cast<uint32_t>(in[i]);
             out[0] = static_cast<uint8_t>(v >> 16);
             out[1] = static_cast<uint8_t>(v >> 8);
             out[2] = static_cast<uint8_t>(v);
@@ -115,13 +123,13 @@ void DibSurface::RandomiseBits(bool bGray) {
     if (bGray) {
         for (int32_t r = 0; r < height_; ++r)
             for (int32_t x = 0; x < width_; ++x) {
-                uint8_t* p = bits_.data() + r * stride + 3 * static_cast<size_t>(x);
+                uint8_t* p = bits_.get() + r * stride + 3 * static_cast<size_t>(x);
                 p[0] = p[1] = p[2] = value();
             }
     } else {
         for (int32_t x = 0; x < width_; ++x)
             for (int32_t r = 0; r < height_; ++r) {
-                uint8_t* p = bits_.data() + r * stride + 3 * static_cast<size_t>(x);
+                uint8_t* p = bits_.get() + r * stride + 3 * static_cast<size_t>(x);
                 p[0] = 0;
                 p[1] = value();
                 p[2] = value();
@@ -158,11 +166,11 @@ void DibSurface::ResampleInto(DibSurface& target) const {
             const auto xi = static_cast<int32_t>(std::floor(sx));
             const float fx = static_cast<float>(static_cast<double>(sx) - xi);
             const int32_t xn = std::min(xi + 1, width_ - 1);
-            const uint8_t* p00 = bits_.data() + static_cast<size_t>(yi) * stride + 3 * static_cast<size_t>(xi);
-            const uint8_t* p10 = bits_.data() + static_cast<size_t>(yi) * stride + 3 * static_cast<size_t>(xn);
-            const uint8_t* p01 = bits_.data() + static_cast<size_t>(yn) * stride + 3 * static_cast<size_t>(xi);
-            const uint8_t* p11 = bits_.data() + static_cast<size_t>(yn) * stride + 3 * static_cast<size_t>(xn);
-            uint8_t* out = target.bits_.data() + static_cast<size_t>(y) * targetStride + 3 * static_cast<size_t>(x);
+            const uint8_t* p00 = bits_.get() + static_cast<size_t>(yi) * stride + 3 * static_cast<size_t>(xi);
+            const uint8_t* p10 = bits_.get() + static_cast<size_t>(yi) * stride + 3 * static_cast<size_t>(xn);
+            const uint8_t* p01 = bits_.get() + static_cast<size_t>(yn) * stride + 3 * static_cast<size_t>(xi);
+            const uint8_t* p11 = bits_.get() + static_cast<size_t>(yn) * stride + 3 * static_cast<size_t>(xn);
+            uint8_t* out = target.bits_.get() + static_cast<size_t>(y) * targetStride + 3 * static_cast<size_t>(x);
             for (int c = 0; c < 3; ++c) {
                 const int32_t left = Nearest((1.0 - fy) * p00[c] + static_cast<double>(fy) * p01[c]);
                 const int32_t right = Nearest((1.0 - fy) * p10[c] + static_cast<double>(fy) * p11[c]);

@@ -1,7 +1,6 @@
 #pragma once
 #include <cstdint>
 #include <memory>
-#include <vector>
 
 #include "paint/Picture.h"
 
@@ -40,9 +39,9 @@ public:
     // Height x BytesPerScanLine, as the bitmap header holds it.
     int32_t ImageSize() const { return imageSize_; }
     // The first pixel byte (of the bottom row); null while the surface is empty.
-    uint8_t* DIBSectionBitsPtr() { return bits_.empty() ? nullptr : bits_.data(); }
-    const uint8_t* DIBSectionBitsPtr() const { return bits_.empty() ? nullptr : bits_.data(); }
-    bool live() const { return !bits_.empty(); }
+    uint8_t* DIBSectionBitsPtr() { return bits_.get(); }
+    const uint8_t* DIBSectionBitsPtr() const { return bits_.get(); }
+    bool live() const { return bits_ != nullptr; }
 
     // Copies a block of `src` from (lSrcLeft, lSrcTop) to this surface's top
     // left corner. A negative width or height means this surface's own;
@@ -61,10 +60,7 @@ public:
     void RandomiseBits(bool bGray = false);
 
     // Frees the pixel block. The size stays as it was.
-    void ClearUp() {
-        bits_.clear();
-        bits_.shrink_to_fit();
-    }
+    void ClearUp() { bits_.reset(); }
 
     // A new surface of the given size (height first) holding this one's
     // pixels: an exact copy at the same size, else the bilinear interpolation
@@ -73,11 +69,12 @@ public:
 
 private:
     // The header and the block for a new size (Create's allocation step).
-    bool CreateDIB(int32_t lWidth, int32_t lHeight);
+    // Unless `zeroed`, only the padding is cleared: the caller fills the rest.
+    bool CreateDIB(int32_t lWidth, int32_t lHeight, bool zeroed = true);
     void ResampleInto(DibSurface& target) const;
     // The pixel at (x, y) in picture coordinates, top row first.
     uint8_t* At(int32_t x, int32_t y) {
-        return bits_.data() + static_cast<size_t>(height_ - 1 - y) * static_cast<size_t>(BytesPerScanLine()) +
+        return bits_.get() + static_cast<size_t>(height_ - 1 - y) * static_cast<size_t>(BytesPerScanLine()) +
                3 * static_cast<size_t>(x);
     }
     const uint8_t* At(int32_t x, int32_t y) const { return const_cast<DibSurface*>(this)->At(x, y); }
@@ -85,5 +82,5 @@ private:
     int32_t width_ = 0;
     int32_t height_ = 0;
     int32_t imageSize_ = 0;
-    std::vector<uint8_t> bits_;
+    std::unique_ptr<uint8_t[]> bits_;
 };

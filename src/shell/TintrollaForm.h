@@ -32,7 +32,7 @@ class PictureView;
 //   shell/TitleScreen.cpp           the colour-cycling title screen
 //   paint/qt/TintrollaForm_Picture.cpp   the work picture's mouse handlers
 //   scheme/qt/TintrollaForm_Colors.cpp   colour boxes, renaming, scheme files
-//   store/qt/TintrollaForm_*.cpp         browser, opening, saving, deleting
+//   store/qt/TintrollaForm_*.cpp         browser, opening, saving, exporting, deleting
 //   shell/TintrollaForm_Print.cpp   the paint-choice printout
 class TintrollaForm : public QMainWindow, public PaintHost {
     Q_OBJECT
@@ -149,6 +149,9 @@ public:
     void OpenPicture();
     void SaveWork();
     void DeletePicture();
+    // Export (store/qt/TintrollaForm_Export.cpp): the blended view to a JPEG or bitmap file, or to the clipboard.
+    void ExportToFileMenuItem_Click();
+    void ToClipboardMenuItem_Click();
     // The literal request for the clipboard's picture.
     static inline const QString kClipboardRequest = QStringLiteral(".GET-FROM-CLIPBOARD.");
     bool showFolder(const QString& folder);

@@ -68,9 +68,10 @@ void TintrollaForm::buildMenus() {
          &TintrollaForm::OpenFromFileMenuItem_Click);
     item(file, "SaveMenuItem", QStringLiteral("&Save"), key(Qt::CTRL | Qt::Key_S), &TintrollaForm::SaveWork);
     QMenu* exportMenu = subMenu(file, "ExportMenu", QStringLiteral("&Export"));
-    // Export lands later; its items are in place and enabled by the rules.
-    item(exportMenu, "ToClipboardMenuItem", QStringLiteral("to &Clipboard"), key(Qt::CTRL | Qt::Key_C), [] {});
-    item(exportMenu, "ExportToFileMenuItem", QStringLiteral("to &File"), key(Qt::CTRL | Qt::Key_E), [] {});
+    item(exportMenu, "ToClipboardMenuItem", QStringLiteral("to &Clipboard"), key(Qt::CTRL | Qt::Key_C),
+         &TintrollaForm::ToClipboardMenuItem_Click);
+    item(exportMenu, "ExportToFileMenuItem", QStringLiteral("to &File"), key(Qt::CTRL | Qt::Key_E),
+         &TintrollaForm::ExportToFileMenuItem_Click);
     file->addSeparator();
     item(file, "PrintMenuItem", QStringLiteral("&Print"), key(Qt::CTRL | Qt::Key_P), &TintrollaForm::PrintMenuItem_Click);
     item(file, "DeleteMenuItem", QStringLiteral("&Delete"), key(Qt::Key_Delete), &TintrollaForm::DeletePicture);
