@@ -19,7 +19,9 @@ QStringList QtFilters(const QString& filter) {
     for (int i = 0; i + 1 < parts.size(); i += 2) {
         QString patterns = parts[i + 1].trimmed();
         patterns.replace(';', ' ');
-        out << QStringLiteral("%1 (%2)").arg(parts[i].trimmed(), patterns);
+        // "JPEG Picture Format (*.jpg)" already names its patterns: not twice.
+        const QString text = parts[i].trimmed();
+        out << (text.endsWith(QStringLiteral("(%1)").arg(patterns)) ? text : QStringLiteral("%1 (%2)").arg(text, patterns));
     }
     return out;
 }

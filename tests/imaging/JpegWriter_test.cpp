@@ -140,6 +140,18 @@ TEST_F(JpegWriter, FailuresRaiseTheirTextsAndKeepTheOldFile) {
     }
 }
 
+TEST_F(JpegWriter, SurfaceWithoutPixelsFailsInTheWrite) {
+    DibSurface empty;
+    EXPECT_FALSE(empty.Create(0, 300));
+    try {
+        imaging::SaveJPG(empty, path("none.jpg"), 90);
+        ADD_FAILURE() << "nothing to write";
+    } catch (const JpegError& e) {
+        EXPECT_EQ(std::string(e.what()), "Failed to save to JPG " + std::to_string(imaging::kJpegBadProperties));
+    }
+    EXPECT_TRUE(Files().empty());
+}
+
 TEST_F(JpegWriter, FullDiskKeepsTheOldFileByteForByte) {
     const std::string old(5000, 'o');
     Put("full.jpg", old);

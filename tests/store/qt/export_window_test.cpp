@@ -8,6 +8,7 @@
 
 #include "imaging/DibSurface.h"
 #include "imaging/qt/SurfaceClipboard.h"
+#include "platform/QtPlatform.h"
 #include "store/qt/BrowserLists.h"
 #include "store/qt/QtPaths.h"
 #include "support/FormFixture.h"
@@ -224,6 +225,13 @@ private slots:
             QVERIFY(s.f.ws().Picture1 == s.shownAfter());
             QVERIFY(s.f.platform().messages.isEmpty());
         }
+    }
+
+    void dialogFiltersNameEachPatternOnce() {
+        QCOMPARE(platform::QtFilters("JPEG Picture Format (*.jpg)|*.jpg|Bitmap Picture Format (*.bmp)|*.bmp"),
+                 QStringList({"JPEG Picture Format (*.jpg)", "Bitmap Picture Format (*.bmp)"}));
+        QCOMPARE(platform::QtFilters("Picture files (BMP, JPG, GIF)| *.BMP;*.JPG;*.GIF|All files (*.*)|*.*"),
+                 QStringList({"Picture files (BMP, JPG, GIF) (*.BMP *.JPG *.GIF)", "All files (*.*)"}));
     }
 
     void surfaceOffersOnlyABitmap() {
