@@ -1,5 +1,7 @@
 // The whole-picture edge pass: blends the borders between colours and between
-// paint and photo (mode 2), or draws them plain again (mode 1).
+// paint and photo (mode 2), or draws them plain again (mode 1). A border pixel
+// that touches a box without a colour or a reference is put back to the
+// photo, as the box's own pixels show it.
 #include <cmath>
 #include <cstdlib>
 
@@ -36,15 +38,13 @@ void PaintEngine::RenderEdges(int mode) {
     const int16_t* color = stroke + Workspace::kMaskPlane;
     int loaded = -1;  // box last loaded by a plain redraw; loading it again changes nothing
 
-    // Column by column, as blends of boxes without a reference carry RefLum
-    // over from the pixel before.
     for (int x = 1; x <= lastX; ++x) {
         for (int y = 1; y <= lastY; ++y) {
             const int at = x + Workspace::kMaskWidth * y;
             if (stroke[at] < 1) {
                 const int k = OutsideBox(stroke, color, at);
                 if (k == 0) continue;
-                if (mode == 1) {
+                if (mode == 1 || (mode == 2 && !Drawable(k))) {
                     ws_.Picture1.setPixel(x, y, ws_.Picture2.pixel(x, y));
                 } else if (mode == 2) {
                     BlendOutsidePixel(x, y, k);
@@ -55,17 +55,21 @@ void PaintEngine::RenderEdges(int mode) {
                 int k = BoundaryBox(color, at);
                 if (k == 0) continue;
                 int own = color[at];
-                if (mode == 2) {
+                // A box that cannot be drawn shows the photo; blending with
+                // it would mix in the button face and a black reference.
+                if (mode == 2 && Drawable(own) && Drawable(k)) {
                     BlendBoundaryPixel(own, k);
                     RecolorPixel(x, y);
                     loaded = -1;
-                } else if (mode == 1) {
+                } else if (mode == 1 && Drawable(own)) {
                     own = std::abs(own);
                     if (own != loaded) {
                         LoadDrawColor(ws_, own);
                         loaded = own;
                     }
                     RecolorPixel(x, y);
+                } else if (mode == 1 || mode == 2) {
+                    ws_.Picture1.setPixel(x, y, ws_.Picture2.pixel(x, y));
                 }
             }
         }

@@ -105,6 +105,8 @@ private:
     // Colours of box i; a box index outside 1..12 (a damaged mask) reads as empty.
     int32_t BoxColor(int i) const;
     int32_t BoxReference(int i) const;
+    // Box |i| can be drawn: it has a colour and a reference.
+    bool Drawable(int i) const;
 
     // The colour RecolorPixel draws for a luma, under the drawing colour.
     int32_t RecolorValue(int32_t lum);

@@ -47,6 +47,11 @@ int32_t PaintEngine::BoxReference(int i) const {
     return i >= 1 && i <= kColorBoxCount ? ws_.Boxes[static_cast<size_t>(i)].reference : 0;
 }
 
+bool PaintEngine::Drawable(int i) const {
+    i = std::abs(i);
+    return BoxColor(i) != kButtonFace && BoxReference(i) != 0;
+}
+
 int32_t PaintEngine::RecolorValue(int32_t lum) {
     if (lum < 0 || lum > 255) return ComputeRecolor(lum, ws_.PaintHue, ws_.PaintSat, ws_.PaintLum, ws_.RefLum);
     const std::array<float, 4> key{ws_.PaintHue, ws_.PaintSat, ws_.PaintLum, ws_.RefLum};
