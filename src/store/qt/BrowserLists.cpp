@@ -4,7 +4,10 @@
 #include <QFileInfo>
 #include <QKeyEvent>
 #include <QRegularExpression>
+#include <QScrollBar>
 #include <QStorageInfo>
+
+#include "store/Volumes.h"
 
 // --- Drives ------------------------------------------------------------------
 
@@ -15,18 +18,57 @@ DriveListBox::DriveListBox(QWidget* parent) : QComboBox(parent) {
     });
 }
 
+namespace {
+
+// Mount points worth offering. The kernel's mount table is read as text so
+// that no pseudo file system is ever asked for its size.
+QStringList OfferedMounts() {
+    const std::string home = QFile::encodeName(QDir::homePath()).toStdString();
+    std::vector<std::string> points;
+    QFile table(QStringLiteral("/proc/self/mounts"));
+    if (table.open(QIODevice::ReadOnly)) {
+        points = store::UserVolumes(table.readAll().toStdString(), home);
+    } else {
+        for (const QStorageInfo& volume : QStorageInfo::mountedVolumes()) {
+            const store::MountEntry entry{volume.device().toStdString(), QFile::encodeName(volume.rootPath()).toStdString(),
+                                          volume.fileSystemType().toStdString()};
+            if (store::IsUserVolume(entry, home)) points.push_back(entry.mountPoint);
+        }
+    }
+    QStringList out;
+    for (const std::string& p : points) out << QFile::decodeName(QByteArray::fromStdString(p));
+    return out;
+}
+
+} // namespace
+
 void DriveListBox::reread() {
     quiet_ = true;
     const QString current = drive();
     clear();
-    for (const QStorageInfo& volume : QStorageInfo::mountedVolumes()) {
-        if (!volume.isValid() || !volume.isReady()) continue;
-        const QString root = volume.rootPath();
-        if (findData(root) >= 0) continue;
-        addItem(root, root);
+    for (const QString& point : OfferedMounts()) {
+        const QStorageInfo volume(point);
+        // Only what is mounted and answers: an empty card reader or a share
+        // that went away is left out.
+        if (!volume.isValid() || !volume.isReady() || volume.rootPath() != point) continue;
+        if (findData(point) < 0) addItem(point, point);
+    }
+    if (!alwaysListed_.isEmpty()) {
+        const QString root = QStorageInfo(alwaysListed_).rootPath();
+        if (!root.isEmpty() && findData(root) < 0) addItem(root, root);
     }
     if (const int i = findData(current); i >= 0) setCurrentIndex(i);
     quiet_ = false;
+}
+
+void DriveListBox::setAlwaysListed(const QString& folder) {
+    alwaysListed_ = folder;
+    reread();
+}
+
+void DriveListBox::showPopup() {
+    reread();  // a stick plugged in since the list last opened shows up
+    QComboBox::showPopup();
 }
 
 QString DriveListBox::drive() const { return currentData().toString(); }
@@ -93,14 +135,28 @@ bool FolderListBox::setPath(const QString& wanted) {
 
 // --- Files -------------------------------------------------------------------
 
-FileListBox::FileListBox(QWidget* parent) : QListWidget(parent) {
+FileListBox::FileListBox(QWidget* parent)
+    : QListWidget(parent), watcher_(new QFileSystemWatcher(this)), settle_(new QTimer(this)) {
     setSelectionMode(QAbstractItemView::SingleSelection);
     connect(this, &QListWidget::itemClicked, this, [this](QListWidgetItem*) { emit fileClicked(); });
+    // A copy or a save touches the folder several times in a row.
+    settle_->setSingleShot(true);
+    settle_->setInterval(150);
+    connect(settle_, &QTimer::timeout, this, &FileListBox::follow);
+    connect(watcher_, &QFileSystemWatcher::directoryChanged, settle_, qOverload<>(&QTimer::start));
 }
 
 void FileListBox::setPath(const QString& path) {
     path_ = path;
+    watch();
     reread();
+}
+
+void FileListBox::watch() {
+    const QStringList watched = watcher_->directories();
+    if (watched.size() == 1 && watched.constFirst() == path_) return;
+    if (!watched.isEmpty()) watcher_->removePaths(watched);
+    if (!path_.isEmpty() && QFileInfo(path_).isDir()) watcher_->addPath(path_);
 }
 
 void FileListBox::setPattern(const QString& pattern) {
@@ -118,13 +174,34 @@ bool FileListBox::matches(const QString& name, const QString& pattern) {
     return false;
 }
 
-void FileListBox::reread() {
-    clear();
-    if (path_.isEmpty()) return;
+QStringList FileListBox::listed() const {
+    QStringList out;
+    if (path_.isEmpty()) return out;
     const QStringList names = QDir(path_).entryList(QDir::Files, QDir::Name | QDir::IgnoreCase);
     for (const QString& name : names)
-        if (matches(name, pattern_)) addItem(name);
+        if (matches(name, pattern_)) out << name;
+    return out;
+}
+
+void FileListBox::reread() {
+    settle_->stop();
+    clear();
+    addItems(listed());
     setCurrentRow(-1);
+}
+
+void FileListBox::follow() {
+    watch();  // a folder removed and made again is watched anew
+    const QStringList names = listed();
+    if (names == entries()) return;
+    const QString selected = selectedName();
+    const int scroll = verticalScrollBar()->value();
+    clear();
+    addItems(names);
+    setCurrentRow(-1);
+    // The chosen picture stays chosen while it is there; nothing is opened.
+    if (const int row = static_cast<int>(names.indexOf(selected)); !selected.isEmpty() && row >= 0) setCurrentRow(row);
+    verticalScrollBar()->setValue(scroll);
 }
 
 QStringList FileListBox::entries() const {

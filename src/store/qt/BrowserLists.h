@@ -1,26 +1,34 @@
 #pragma once
 #include <QComboBox>
+#include <QFileSystemWatcher>
 #include <QListWidget>
 #include <QStringList>
+#include <QTimer>
 
 // The picture browser's three lists: mounted volumes, the folder chain with
 // its subfolders, and the pictures of the folder that match the pattern.
 
-// Mounted volumes by their root path. `drive()` is the chosen root.
+// Mounted volumes a person would pick, by their root path, read again each
+// time the list opens. `drive()` is the chosen root.
 class DriveListBox : public QComboBox {
     Q_OBJECT
 public:
     explicit DriveListBox(QWidget* parent = nullptr);
     void reread();
+    // The volume holding `folder` (the program's own) is listed whatever it is.
+    void setAlwaysListed(const QString& folder);
     QString drive() const;
     // Shows the volume that holds `path` (adding it when the list lacks it).
     void setDriveOf(const QString& path);
+
+    void showPopup() override;
 
 signals:
     void driveChosen();  // the user picked a drive
 
 private:
     bool quiet_ = false;
+    QString alwaysListed_;
 };
 
 // The folder chain from the root down to the open folder, then its
@@ -45,7 +53,8 @@ private:
 };
 
 // Files of one folder that match a pattern such as "*.jpg;*.gif;*.bmp",
-// letter case ignored, sorted by name.
+// letter case ignored, sorted by name. The list follows the folder: files
+// added or removed by other programs appear and go, the selection staying.
 class FileListBox : public QListWidget {
     Q_OBJECT
 public:
@@ -68,6 +77,11 @@ protected:
 
 private:
     static bool matches(const QString& name, const QString& pattern);
+    QStringList listed() const;  // the matching names in the folder now
+    void watch();                // the watcher holds the shown folder alone
+    void follow();               // takes in what changed, keeping the selection
     QString path_;
     QString pattern_;
+    QFileSystemWatcher* watcher_;
+    QTimer* settle_;             // one reread for a burst of changes
 };

@@ -19,6 +19,7 @@ void TintrollaForm::buildBrowser() {
     connect(Dir1, &FolderListBox::pathChanged, this, &TintrollaForm::Dir1_Change);
     connect(File1, &FileListBox::fileClicked, this, &TintrollaForm::File1_Click);
     File1->setPattern(kPattern);
+    Drive1->setAlwaysListed(ProgramFolder);
 }
 
 void TintrollaForm::SetFileListPattern() { File1->setPattern(kPattern); }
@@ -46,9 +47,10 @@ void TintrollaForm::ShowPicsFolder() {
 void TintrollaForm::ShowDesktopFolder() {
     QString folder = QStandardPaths::writableLocation(QStandardPaths::DesktopLocation);
     if (!folder.isEmpty() && !folder.endsWith('/')) folder += '/';
-    if (!showFolder(folder))
-        Ask(QStringLiteral("Warning - Shortcut to Desktop"), QStringLiteral("Can't find Windows Desktop.") + kCrLf + folder,
-            platform::Buttons::Ok);
+    // Many Linux desktops have no desktop folder: home is the nearest place.
+    if (showFolder(folder) || showFolder(QDir::homePath())) return;
+    Ask(QStringLiteral("Warning - Shortcut to Desktop"), QStringLiteral("Can't find Windows Desktop.") + kCrLf + folder,
+        platform::Buttons::Ok);
 }
 
 void TintrollaForm::Dir1_Change() {

@@ -136,6 +136,8 @@ private slots:
             QVERIFY(Click(f, "garden.bmp") && Loaded(f) && Shows(f.ws().Picture2, kHouse) && !f.ws().PictureModified);
             QVERIFY(f.ws().Stroke(12, 20) == -3 && f.ws().StrokeNumber == 2 && f.ws().UndoEnabled && f.ws().RedoEnabled);
             QVERIFY(f.ws().Boxes[5].name == (withScheme ? "Garage Door" : "Other") && f.ws().Boxes[5].reference == (withScheme ? 0x808080 : 0));
+            // Without its scheme no box can be drawn: the photo shows, edges too.
+            QCOMPARE(f.ws().Picture1 == f.ws().Picture2, !withScheme);
         }
     }
 
