@@ -6,10 +6,15 @@
 #include <QDesktopServices>
 #include <QDialog>
 #include <QFileDialog>
+#include <QLabel>
+#include <QLayout>
 #include <QMessageBox>
 #include <QPalette>
 #include <QPrintDialog>
 #include <QPrinter>
+#include <QScreen>
+#include <algorithm>
+#include <cmath>
 
 namespace platform {
 
@@ -26,31 +31,85 @@ QStringList QtFilters(const QString& filter) {
     return out;
 }
 
-Answer QtPlatform::message(QWidget* parent, const Message& m) {
-    QMessageBox box(parent);
-    box.setWindowTitle(m.title);
-    box.setText(m.text);
+namespace {
+
+// A message box that keeps each line of its text on one line. Qt sizes a
+// box to at most about half the screen and wraps what is longer; the help
+// topics have lines beyond that.
+class LineKeepingMessageBox : public QMessageBox {
+public:
+    using QMessageBox::QMessageBox;
+
+protected:
+    void showEvent(QShowEvent* event) override {
+        QMessageBox::showEvent(event);  // Qt's own sizing first
+        auto* label = findChild<QLabel*>(QStringLiteral("qt_msgbox_label"));
+        if (!label || !layout()) return;
+        // The longest line as the label's font lays it out, in whole pixels
+        // rounded up, plus the label's own margins.
+        const QFontMetricsF fm(label->font());
+        qreal longest = 0;
+        for (const QString& line : text().split('\n')) longest = std::max(longest, fm.horizontalAdvance(line));
+        const QMargins margins = label->contentsMargins();
+        const int needed = static_cast<int>(std::ceil(longest)) + 1 + margins.left() + margins.right() + 2 * label->margin();
+        // Only a screen too narrow for the line makes it wrap.
+        const int room = screen() ? screen()->availableGeometry().width() * 9 / 10 : width();
+        // The icon, the spacing and the box's margins beside the label.
+        const int others = layout()->totalMinimumSize().width() - label->minimumSizeHint().width();
+        label->setMinimumWidth(std::min(needed, room - others));
+        const int wide = std::max(width(), layout()->totalMinimumSize().width());
+        const int high = layout()->hasHeightForWidth() ? layout()->totalHeightForWidth(wide)
+                                                        : layout()->totalMinimumSize().height();
+        setFixedSize(wide, high);
+    }
+};
+
+} // namespace
+
+std::unique_ptr<QMessageBox> MakeMessageBox(QWidget* parent, const Message& m) {
+    auto box = std::make_unique<LineKeepingMessageBox>(parent);
+    box->setWindowTitle(m.title);
+    // The program's texts are plain ("<Enter>" is a key, not a tag); lines
+    // are joined by CR LF, which Qt shows as one break.
+    box->setTextFormat(Qt::PlainText);
+    box->setText(QString(m.text).replace(QStringLiteral("\r\n"), QStringLiteral("\n")));
     switch (m.icon) {
-    case Icon::None: box.setIcon(QMessageBox::NoIcon); break;
-    case Icon::Exclamation: box.setIcon(QMessageBox::Warning); break;
-    case Icon::Question: box.setIcon(QMessageBox::Question); break;
-    case Icon::Information: box.setIcon(QMessageBox::Information); break;
-    case Icon::Critical: box.setIcon(QMessageBox::Critical); break;
+    case Icon::None: box->setIcon(QMessageBox::NoIcon); break;
+    case Icon::Exclamation: box->setIcon(QMessageBox::Warning); break;
+    case Icon::Question: box->setIcon(QMessageBox::Question); break;
+    case Icon::Information: box->setIcon(QMessageBox::Information); break;
+    case Icon::Critical: box->setIcon(QMessageBox::Critical); break;
     }
     switch (m.buttons) {
-    case Buttons::Ok: box.setStandardButtons(QMessageBox::Ok); break;
-    case Buttons::OkCancel: box.setStandardButtons(QMessageBox::Ok | QMessageBox::Cancel); break;
-    case Buttons::YesNo: box.setStandardButtons(QMessageBox::Yes | QMessageBox::No); break;
+    case Buttons::Ok: box->setStandardButtons(QMessageBox::Ok); break;
+    case Buttons::OkCancel: box->setStandardButtons(QMessageBox::Ok | QMessageBox::Cancel); break;
+    case Buttons::YesNo: box->setStandardButtons(QMessageBox::Yes | QMessageBox::No); break;
     case Buttons::YesNoCancel:
-        box.setStandardButtons(QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel);
+        box->setStandardButtons(QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel);
         break;
     }
-    switch (box.exec()) {
+    return box;
+}
+
+Answer QtPlatform::message(QWidget* parent, const Message& m) {
+    const std::unique_ptr<QMessageBox> box = MakeMessageBox(parent, m);
+    switch (box->exec()) {
     case QMessageBox::Yes: return Answer::Yes;
     case QMessageBox::No: return Answer::No;
     case QMessageBox::Ok: return Answer::Ok;
     default: return Answer::Cancel;
     }
+}
+
+void PrepareFileDialog(QFileDialog& dialog) {
+    dialog.setViewMode(QFileDialog::Detail);
+    // Room for a long picture name beside its size, type and date, and for
+    // a screenful of names; never more than the screen.
+    const QFontMetrics fm = dialog.fontMetrics();
+    QSize size(fm.averageCharWidth() * 110, fm.lineSpacing() * 32);
+    if (const QScreen* screen = dialog.screen())
+        size = size.boundedTo(screen->availableGeometry().size() * 9 / 10);
+    dialog.resize(size.expandedTo(dialog.minimumSizeHint()));
 }
 
 namespace {
@@ -62,6 +121,7 @@ FileChoice RunFileDialog(QWidget* parent, const FileRequest& r, QFileDialog::Acc
     dialog.setNameFilters(filters);
     if (mode == QFileDialog::AcceptSave) dialog.setOption(QFileDialog::DontConfirmOverwrite, true);
     if (!r.fileName.isEmpty()) dialog.selectFile(r.fileName);
+    PrepareFileDialog(dialog);
     FileChoice choice;
     if (dialog.exec() != QDialog::Accepted || dialog.selectedFiles().isEmpty()) return choice;
     choice.cancelled = false;
