@@ -16,6 +16,11 @@ QColor ColorBoxQColor(int32_t value, const QColor& buttonFace) {
     return QColor(value & 0xFF, (value >> 8) & 0xFF, (value >> 16) & 0xFF);
 }
 
+QColor ColorBoxNameColor(int32_t backColor, int32_t foreColor, const QPalette& host) {
+    if (backColor == kButtonFace) return host.color(QPalette::ButtonText);
+    return ColorBoxQColor(foreColor, Qt::white);
+}
+
 namespace {
 int ButtonCode(Qt::MouseButton b) {
     return b == Qt::LeftButton ? kLeftButton : b == Qt::RightButton ? kRightButton : kMiddleButton;
@@ -32,7 +37,7 @@ void ColorBoxLabel::setLook(int32_t backColor, int32_t foreColor, bool flat) {
     const QWidget* host = parentWidget() ? parentWidget() : this;
     QPalette pal = palette();
     pal.setColor(QPalette::Window, ColorBoxQColor(backColor, host->palette().color(QPalette::Button)));
-    pal.setColor(QPalette::WindowText, ColorBoxQColor(foreColor, Qt::white));
+    pal.setColor(QPalette::WindowText, ColorBoxNameColor(backColor, foreColor, host->palette()));
     setPalette(pal);
     setFrameStyle(flat ? (QFrame::Box | QFrame::Plain) : (QFrame::Panel | QFrame::Raised));
     setLineWidth(flat ? 1 : 2);

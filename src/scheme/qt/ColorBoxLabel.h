@@ -36,3 +36,8 @@ private:
 
 // A colour value as a QColor; kButtonFace becomes `buttonFace`.
 QColor ColorBoxQColor(int32_t value, const QColor& buttonFace);
+
+// The colour a box's name is drawn in over `backColor`. On the button face
+// (no colour set) white cannot be read on a light desktop theme, so the name
+// takes the theme's button text; over a paint colour it is `foreColor`.
+QColor ColorBoxNameColor(int32_t backColor, int32_t foreColor, const QPalette& host);

@@ -76,7 +76,8 @@ void TintrollaForm::syncColorBoxes() {
         PickupColorLabel->setText(Caption(under));
         QPalette pal = PickupColorLabel->palette();
         pal.setColor(QPalette::Window, ColorBoxQColor(ws.PickupLabelColor, buttonFace));
-        pal.setColor(QPalette::WindowText, ColorBoxQColor(ForeColorFor(under.color), Qt::white));
+        pal.setColor(QPalette::WindowText,
+                     ColorBoxNameColor(ws.PickupLabelColor, ForeColorFor(under.color), ColorSchemeFrame->palette()));
         PickupColorLabel->setPalette(pal);
         PickupColorLabel->raise();
         PickupColorLabel->show();

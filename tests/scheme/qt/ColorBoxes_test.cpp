@@ -46,6 +46,12 @@ private slots:
             f.form().ClearAllColorsMenuItem_Click();
             QCOMPARE(f.ws().Boxes[4].color, left);
         }
+        // Without colour the name takes the theme's button text, readable on the button face.
+        const QColor buttonText = f.form().ColorSchemeFrame->palette().color(QPalette::ButtonText);
+        QVERIFY(Shown(Box(f, 4), QPalette::WindowText) == buttonText && Shown(Box(f, 9), QPalette::WindowText) == buttonText);
+        f.ws().Boxes[9].color = 0x206350;  // green 99: white, as ever
+        f.form().ToolStateChanged();
+        QCOMPARE(Shown(Box(f, 9), QPalette::WindowText), QColor(Qt::white));
         const platform::Message m = f.platform().messages.value(1);
         QVERIFY(m.title == "Clear All Colors" && m.text == "Are you Sure?" && m.buttons == platform::Buttons::YesNo);
     }
