@@ -6,6 +6,7 @@
 #include <QDesktopServices>
 #include <QDialog>
 #include <QFileDialog>
+#include <QHeaderView>
 #include <QLabel>
 #include <QLayout>
 #include <QMessageBox>
@@ -13,6 +14,7 @@
 #include <QPrintDialog>
 #include <QPrinter>
 #include <QScreen>
+#include <QTreeView>
 #include <algorithm>
 #include <cmath>
 
@@ -46,12 +48,12 @@ protected:
         auto* label = findChild<QLabel*>(QStringLiteral("qt_msgbox_label"));
         if (!label || !layout()) return;
         // The longest line as the label's font lays it out, in whole pixels
-        // rounded up, plus the label's own margins.
+        // rounded up, plus the label's own margins and two letters of air.
         const QFontMetricsF fm(label->font());
         qreal longest = 0;
         for (const QString& line : text().split('\n')) longest = std::max(longest, fm.horizontalAdvance(line));
         const QMargins margins = label->contentsMargins();
-        const int needed = static_cast<int>(std::ceil(longest)) + 1 + margins.left() + margins.right() + 2 * label->margin();
+        const int needed = static_cast<int>(std::ceil(longest + 2 * fm.averageCharWidth())) + margins.left() + margins.right() + 2 * label->margin();
         // Only a screen too narrow for the line makes it wrap.
         const int room = screen() ? screen()->availableGeometry().width() * 9 / 10 : width();
         // The icon, the spacing and the box's margins beside the label.
@@ -106,10 +108,16 @@ void PrepareFileDialog(QFileDialog& dialog) {
     // Room for a long picture name beside its size, type and date, and for
     // a screenful of names; never more than the screen.
     const QFontMetrics fm = dialog.fontMetrics();
-    QSize size(fm.averageCharWidth() * 110, fm.lineSpacing() * 32);
+    const int letter = fm.horizontalAdvance(QLatin1Char('n'));  // a lower-case letter, as names mostly are
+    QSize size(letter * 120, fm.lineSpacing() * 32);
     if (const QScreen* screen = dialog.screen())
         size = size.boundedTo(screen->availableGeometry().size() * 9 / 10);
     dialog.resize(size.expandedTo(dialog.minimumSizeHint()));
+    // Qt's own dialog: name, size, type and date columns wide enough to read.
+    if (auto* files = dialog.findChild<QTreeView*>(QStringLiteral("treeView"))) {
+        const int widths[] = {46, 11, 22, 24};
+        for (int column = 0; column < 4; ++column) files->header()->resizeSection(column, widths[column] * letter);
+    }
 }
 
 namespace {

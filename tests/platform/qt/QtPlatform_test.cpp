@@ -1,5 +1,7 @@
 // The desktop's message boxes and file dialogs, built but never run modally.
 #include <QFileDialog>
+#include <QHeaderView>
+#include <QTreeView>
 #include <QLabel>
 #include <QMessageBox>
 #include <QScreen>
@@ -61,6 +63,11 @@ private slots:
         QVERIFY(dialog.width() >= fm.horizontalAdvance(QString(80, 'n')) && dialog.height() >= 24 * fm.lineSpacing());
         QVERIFY(dialog.width() <= dialog.screen()->availableGeometry().width());
         QCOMPARE(dialog.viewMode(), QFileDialog::Detail);
+        dialog.setOption(QFileDialog::DontUseNativeDialog);
+        platform::PrepareFileDialog(dialog);
+        const auto* files = dialog.findChild<QTreeView*>("treeView");
+        QVERIFY(files && files->header()->sectionSize(0) >= fm.horizontalAdvance(QString(40, 'n')));   // a long name
+        dialog.setOption(QFileDialog::DontUseNativeDialog, false);
         QVERIFY(!dialog.testOption(QFileDialog::DontUseNativeDialog));   // the desktop's own dialog where there is one
     }
 };
