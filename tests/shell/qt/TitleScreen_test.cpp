@@ -1,6 +1,8 @@
 // The title screen: background with turning hues, the window icon, the texts,
 // the poll's timer, and "&About" returning to it with the work kept.
 #include <QAction>
+#include <QFontDatabase>
+#include <QFontInfo>
 #include <QTest>
 #include <QTimer>
 #include <algorithm>
@@ -18,8 +20,12 @@ private slots:
 };
 
 void TitleScreenTest::drawnAtStartAndAfterAbout() {
+    // The texts below are looked for where the faces setup.sh installs put them.
+    for (const QString family : {"Liberation Serif", "Liberation Sans"})
+        QVERIFY2(QFontDatabase::hasFamily(family), qPrintable(family + " is not installed: run scripts/setup.sh"));
     FormFixture f;
     f.form().DrawTitleScreen();
+    QCOMPARE(QFontInfo(f.form().Picture1->font()).family(), QStringLiteral("Liberation Sans"));  // the last text's face
     const Picture p = f.ws().Picture1;
     // Clean colour values for the engine: nothing in the top byte.
     QVERIFY(std::all_of(p.data(), p.data() + p.width() * p.height(), [](int32_t c) { return c >> 24 == 0; }));
